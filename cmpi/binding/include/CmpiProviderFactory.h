@@ -1,0 +1,91 @@
+// The exported factories through which a broker obtains a provider's
+// management interfaces. CMProviderBase(pn) defines the static base object
+// `base<pn>`; each factory macro defines `<pn>_Create_<Kind>MI` with its own
+// function table, named "<kind><pn>", and its own interface object.
+//
+// Every factory call: wraps the context; points its interface object at its
+// table; creates, attaches and initializes the provider when the base object
+// has none yet (initialize's status is not looked at, so a provider whose
+// initialization failed is still served); records it in the base object;
+// instance factories then write one line to standard error; finally the
+// interface's handle is set to the provider, the use count is raised and the
+// interface is returned.
+#pragma once
+
+#include <cstdio>
+#include <typeinfo>
+
+#include "CmpiAssociationMI.h"
+#include "CmpiBaseMI.h"
+#include "CmpiIndicationMI.h"
+#include "CmpiInstanceMI.h"
+#include "CmpiProviderBase.h"
+
+#define CMPI_FACTORY_EXPORT extern "C" __attribute__((visibility("default")))
+
+#define CMProviderBase(pn) CmpiProviderBase base##pn
+
+#define CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                  \
+    CmpiBaseMI *provider = base##pn.getBaseMI();              \
+    if (provider == nullptr) {                                \
+        CmpiBroker wrappedBroker(broker);                     \
+        provider = new cn(wrappedBroker, context);            \
+        provider->setProviderBase(&base##pn);                 \
+        provider->initialize(context);                        \
+        base##pn.setBaseMI(provider);                         \
+    }
+
+#define CMInstanceMIFactory(cn, pn)                                                         \
+    CMPI_FACTORY_EXPORT CMPIInstanceMI *pn##_Create_InstanceMI(                             \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                  \
+        static const CMPIInstanceMIFT table = {                                             \
+            CMPICurrentVersion,                 CMPICurrentVersion,                         \
+            "instance" #pn,                     CmpiBaseMI::driveBaseCleanup,               \
+            CmpiInstanceMI::driveEnumInstanceNames, CmpiInstanceMI::driveEnumInstances,     \
+            CmpiInstanceMI::driveGetInstance,   CmpiInstanceMI::driveCreateInstance,        \
+            CmpiInstanceMI::driveSetInstance,   CmpiInstanceMI::driveDeleteInstance,        \
+            CmpiInstanceMI::driveExecQuery};                                                \
+        static CMPIInstanceMI mi;                                                           \
+        CmpiContext context(ctx);                                                           \
+        mi.ft = &table;                                                                     \
+        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                                \
+        std::fprintf(stderr, "--- _Create_InstanceMI() %s\n", typeid(CmpiBaseMI *).name()); \
+        mi.hdl = provider;                                                                  \
+        base##pn.incUseCount();                                                             \
+        return &mi;                                                                         \
+    }
+
+#define CMAssociationMIFactory(cn, pn)                                                    \
+    CMPI_FACTORY_EXPORT CMPIAssociationMI *pn##_Create_AssociationMI(                     \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                \
+        static const CMPIAssociationMIFT table = {                                        \
+            CMPICurrentVersion,                     CMPICurrentVersion,                   \
+            "association" #pn,                      CmpiBaseMI::driveBaseCleanup,         \
+            CmpiAssociationMI::driveAssociators,    CmpiAssociationMI::driveAssociatorNames, \
+            CmpiAssociationMI::driveReferences,     CmpiAssociationMI::driveReferenceNames}; \
+        static CMPIAssociationMI mi;                                                      \
+        CmpiContext context(ctx);                                                         \
+        mi.ft = &table;                                                                   \
+        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                              \
+        mi.hdl = provider;                                                                \
+        base##pn.incUseCount();                                                           \
+        return &mi;                                                                       \
+    }
+
+#define CMIndicationMIFactory(cn, pn)                                                        \
+    CMPI_FACTORY_EXPORT CMPIIndicationMI *pn##_Create_IndicationMI(                          \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                   \
+        static const CMPIIndicationMIFT table = {                                            \
+            CMPICurrentVersion,                       CMPICurrentVersion,                    \
+            "indication" #pn,                         CmpiBaseMI::driveBaseCleanup,          \
+            CmpiIndicationMI::driveAuthorizeFilter,   CmpiIndicationMI::driveMustPoll,       \
+            CmpiIndicationMI::driveActivateFilter,    CmpiIndicationMI::driveDeActivateFilter, \
+            CmpiIndicationMI::driveEnableIndications, CmpiIndicationMI::driveDisableIndications}; \
+        static CMPIIndicationMI mi;                                                          \
+        CmpiContext context(ctx);                                                            \
+        mi.ft = &table;                                                                      \
+        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                                 \
+        mi.hdl = provider;                                                                   \
+        base##pn.incUseCount();                                                              \
+        return &mi;                                                                          \
+    }
