@@ -1,0 +1,159 @@
+#include "core/Broker.h"
+
+#include "core/BrokerState.h"
+#include "core/EncSupport.h"
+#include "core/Requests.h"
+
+namespace tvxbroker {
+
+Broker::Broker(BrokerConfig config) : state(std::make_unique<State>(std::move(config))) {}
+
+Broker::~Broker() { shutdown(); }
+
+Response Broker::enumInstanceNames(const ObjectPath &classPath) {
+    return requests::enumInstanceNames(*state, classPath);
+}
+
+Response Broker::enumInstances(const ObjectPath &classPath, const PropertyList &properties) {
+    return requests::enumInstances(*state, classPath, properties);
+}
+
+Response Broker::getInstance(const ObjectPath &path, const PropertyList &properties) {
+    return requests::getInstance(*state, path, properties);
+}
+
+Response Broker::createInstance(const ObjectPath &path, const Instance &instance) {
+    return requests::createInstance(*state, path, instance);
+}
+
+Response Broker::setInstance(const ObjectPath &path, const Instance &instance,
+                             const PropertyList &properties) {
+    return requests::setInstance(*state, path, instance, properties);
+}
+
+Response Broker::deleteInstance(const ObjectPath &path) {
+    return requests::deleteInstance(*state, path);
+}
+
+Response Broker::execQuery(const ObjectPath &classPath, const std::string &query,
+                           const std::string &language) {
+    return requests::execQuery(*state, classPath, query, language);
+}
+
+Response Broker::associators(const ObjectPath &path, const std::string &assocClass,
+                             const std::string &resultClass, const std::string &role,
+                             const std::string &resultRole, const PropertyList &properties) {
+    return requests::association(*state, requests::AssociationCall::Associators, path,
+                                 {assocClass, resultClass, role, resultRole}, properties);
+}
+
+Response Broker::associatorNames(const ObjectPath &path, const std::string &assocClass,
+                                 const std::string &resultClass, const std::string &role,
+                                 const std::string &resultRole) {
+    return requests::association(*state, requests::AssociationCall::AssociatorNames, path,
+                                 {assocClass, resultClass, role, resultRole}, std::nullopt);
+}
+
+Response Broker::references(const ObjectPath &path, const std::string &resultClass,
+                            const std::string &role, const PropertyList &properties) {
+    return requests::association(*state, requests::AssociationCall::References, path,
+                                 {"", resultClass, role, ""}, properties);
+}
+
+Response Broker::referenceNames(const ObjectPath &path, const std::string &resultClass,
+                                const std::string &role) {
+    return requests::association(*state, requests::AssociationCall::ReferenceNames, path,
+                                 {"", resultClass, role, ""}, std::nullopt);
+}
+
+Response Broker::authorizeFilter(const std::string &nameSpace, const std::string &indicationClass,
+                                 const std::string &query, const std::string &owner) {
+    return requests::indication(*state, requests::IndicationCall::Authorize,
+                                {nameSpace, indicationClass, query, owner, false});
+}
+
+Response Broker::mustPoll(const std::string &nameSpace, const std::string &indicationClass,
+                          const std::string &query) {
+    return requests::indication(*state, requests::IndicationCall::MustPoll,
+                                {nameSpace, indicationClass, query, "", false});
+}
+
+Response Broker::activateFilter(const std::string &nameSpace, const std::string &indicationClass,
+                                const std::string &query, bool firstActivation) {
+    return requests::indication(*state, requests::IndicationCall::Activate,
+                                {nameSpace, indicationClass, query, "", firstActivation});
+}
+
+Response Broker::deActivateFilter(const std::string &nameSpace,
+                                  const std::string &indicationClass, const std::string &query,
+                                  bool lastActivation) {
+    return requests::indication(*state, requests::IndicationCall::Deactivate,
+                                {nameSpace, indicationClass, query, "", lastActivation});
+}
+
+Response Broker::enableIndications(const std::string &nameSpace,
+                                   const std::string &indicationClass) {
+    return requests::indication(*state, requests::IndicationCall::Enable,
+                                {nameSpace, indicationClass, "", "", false});
+}
+
+Response Broker::disableIndications(const std::string &nameSpace,
+                                    const std::string &indicationClass) {
+    return requests::indication(*state, requests::IndicationCall::Disable,
+                                {nameSpace, indicationClass, "", "", false});
+}
+
+int Broker::subscribe(IndicationSubscriber subscriber) {
+    std::lock_guard<std::mutex> lock(state->subscriberMutex);
+    const int id = state->nextSubscription++;
+    state->subscribers.emplace(id, std::move(subscriber));
+    return id;
+}
+
+void Broker::unsubscribe(int subscription) {
+    std::lock_guard<std::mutex> lock(state->subscriberMutex);
+    state->subscribers.erase(subscription);
+}
+
+void *Broker::managementInterface(const std::string &providerName, InterfaceKind kind,
+                                  std::string *error) {
+    return state->obtain(providerName, kind, error);
+}
+
+void Broker::shutdown() { state->shutdown(); }
+
+const CMPIBroker *Broker::cmpiBroker() const { return &state->cmpi; }
+
+const CMPIContext *Broker::newContext(const std::string &nameSpace) {
+    std::unique_ptr<EncContext> context = enc::makeContext(requestContextEntries(nameSpace));
+    const CMPIContext *handle = &context->cmpi;
+    std::lock_guard<std::mutex> lock(state->threadMutex);
+    state->spareContexts.push_back(std::move(context));
+    return handle;
+}
+
+const ClassSchema &Broker::schema() const { return state->config.schema; }
+
+const std::vector<ProviderRegistration> &Broker::registrations() const {
+    return state->config.registrations;
+}
+
+std::size_t Broker::liveObjectCount() const { return ObjectPool::liveCount(); }
+
+BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
+                              const std::string &registrationFile,
+                              const std::vector<std::string> &mofFiles) {
+    BrokerConfig config;
+    config.providerDirs = providerDirs;
+    config.registrations = readRegistrationFile(registrationFile);
+    for (const std::string &mof : mofFiles) config.schema.loadFile(mof);
+    for (const ProviderRegistration &registration : config.registrations) {
+        if (config.schema.find(registration.className) == nullptr) {
+            throw std::runtime_error(registrationFile + ": class " + registration.className +
+                                     " is registered but declared in no MOF file");
+        }
+    }
+    return config;
+}
+
+}  // namespace tvxbroker

@@ -1,0 +1,219 @@
+#include "core/BrokerState.h"
+
+#include <dlfcn.h>
+#include <unistd.h>
+
+#include <cstdio>
+
+#include "core/EncSupport.h"
+
+namespace tvxbroker {
+
+namespace {
+
+const char *kindName(InterfaceKind kind) {
+    switch (kind) {
+    case InterfaceKind::Instance: return "Instance";
+    case InterfaceKind::Association: return "Association";
+    case InterfaceKind::Indication: return "Indication";
+    }
+    return "";
+}
+
+const ProviderRegistration *registrationOf(const BrokerConfig &config, const std::string &provider) {
+    for (const ProviderRegistration &registration : config.registrations) {
+        if (registration.providerName == provider) return &registration;
+    }
+    return nullptr;
+}
+
+void *callFactory(void *factory, InterfaceKind kind, CMPIBroker *broker, const CMPIContext *ctx,
+                  CMPIStatus *rc) {
+    switch (kind) {
+    case InterfaceKind::Instance:
+        return reinterpret_cast<CMPIInstanceMIFactory>(factory)(broker, ctx, rc);
+    case InterfaceKind::Association:
+        return reinterpret_cast<CMPIAssociationMIFactory>(factory)(broker, ctx, rc);
+    case InterfaceKind::Indication:
+        return reinterpret_cast<CMPIIndicationMIFactory>(factory)(broker, ctx, rc);
+    }
+    return nullptr;
+}
+
+CMPIStatus cleanupInterface(void *mi, InterfaceKind kind, const CMPIContext *ctx) {
+    switch (kind) {
+    case InterfaceKind::Instance: {
+        auto *instance = static_cast<CMPIInstanceMI *>(mi);
+        return instance->ft->cleanup(instance, ctx, 1);
+    }
+    case InterfaceKind::Association: {
+        auto *association = static_cast<CMPIAssociationMI *>(mi);
+        return association->ft->cleanup(association, ctx, 1);
+    }
+    case InterfaceKind::Indication: {
+        auto *indication = static_cast<CMPIIndicationMI *>(mi);
+        return indication->ft->cleanup(indication, ctx, 1);
+    }
+    }
+    return enc::status(CMPI_RC_ERR_INVALID_HANDLE);
+}
+
+std::string messageOf(const CMPIStatus &status) {
+    EncString *text = enc::stringOf(status.msg);
+    return text != nullptr ? text->text : std::string();
+}
+
+}  // namespace
+
+std::vector<NamedValue> requestContextEntries(const std::string &nameSpace) {
+    return {NamedValue{CMPIInitNameSpace, CimValue::makeString(nameSpace)},
+            NamedValue{CMPIInvocationFlags, CimValue::makeUnsigned(CMPI_uint32, 0)},
+            NamedValue{CMPIPrincipal, CimValue::makeString("root")}};
+}
+
+Broker::State::State(BrokerConfig configuration) : config(std::move(configuration)) {
+    cmpi.hdl = this;
+    cmpi.bft = &brokerFT;
+    cmpi.eft = &brokerEncFT;
+    cmpi.xft = &brokerExtFT;
+    cmpi.mft = &brokerMemFT;
+}
+
+LoadedLibrary &Broker::State::library(const std::string &location) {
+    auto found = libraries.find(location);
+    if (found != libraries.end()) return found->second;
+    LoadedLibrary &loaded = libraries[location];
+    const std::string file = "lib" + location + ".so";
+    for (const std::string &dir : config.providerDirs) {
+        const std::string path = dir + "/" + file;
+        if (access(path.c_str(), F_OK) != 0) continue;
+        loaded.handle = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL);
+        if (loaded.handle == nullptr) {
+            const char *reason = dlerror();
+            loaded.error = "cannot load " + path + ": " + (reason != nullptr ? reason : "unknown error");
+        }
+        return loaded;
+    }
+    loaded.error = "provider library " + file + " not found in the provider directories";
+    return loaded;
+}
+
+void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std::string *error) {
+    std::lock_guard<std::recursive_mutex> lock(loadMutex);
+    for (const LoadedInterface &known : interfaces) {
+        if (known.provider == provider && known.kind == kind) {
+            if (error != nullptr) *error = known.error;
+            return known.mi;
+        }
+    }
+    LoadedInterface loaded{provider, kind, nullptr, ""};
+    const std::string symbol = provider + "_Create_" + kindName(kind) + "MI";
+    const ProviderRegistration *registration = registrationOf(config, provider);
+    if (shutDown) {
+        loaded.error = "the broker has shut down";
+    } else if (registration == nullptr) {
+        loaded.error = "provider " + provider + " is not registered";
+    } else if (LoadedLibrary &lib = library(registration->location); lib.handle == nullptr) {
+        loaded.error = "provider " + provider + ": " + lib.error;
+    } else if (void *factory = dlsym(lib.handle, symbol.c_str()); factory == nullptr) {
+        loaded.error = "provider " + provider + ": library lib" + registration->location +
+                       ".so has no factory " + symbol;
+    } else {
+        RequestScope scope;
+        const std::string nameSpace =
+            registration->namespaces.empty() ? "root/cimv2" : registration->namespaces.front();
+        CMPIContext *ctx = enc::newContext(requestContextEntries(nameSpace));
+        CMPIStatus rc = enc::status(CMPI_RC_OK);
+        try {
+            loaded.mi = callFactory(factory, kind, &cmpi, ctx, &rc);
+            if (loaded.mi == nullptr) {
+                loaded.error = "provider " + provider + ": factory " + symbol + " returned no interface";
+            }
+        } catch (...) {
+            loaded.error = "provider " + provider + ": factory " + symbol + " failed with an exception";
+        }
+    }
+    if (!loaded.error.empty()) std::fprintf(stderr, "tvxbroker: %s\n", loaded.error.c_str());
+    if (error != nullptr) *error = loaded.error;
+    interfaces.push_back(loaded);
+    return loaded.mi;
+}
+
+CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
+    auto thread = std::make_unique<ThreadContextState>();
+    thread->context = enc::makeContext(from.entries);
+    thread->context->thread = thread.get();
+    CMPIContext *handle = &thread->context->cmpi;
+    std::lock_guard<std::mutex> lock(threadMutex);
+    threadContexts.push_back(std::move(thread));
+    return handle;
+}
+
+void Broker::State::callProvider(
+    const std::string &provider, InterfaceKind kind, const std::string &nameSpace,
+    Response &response,
+    const std::function<CMPIStatus(void *, const CMPIContext *, const CMPIResult *)> &call) {
+    std::string error;
+    void *mi = obtain(provider, kind, &error);
+    if (mi == nullptr) {
+        response.rc = CMPI_RC_ERR_FAILED;
+        response.message = error;
+        return;
+    }
+    RequestScope scope;
+    CMPIContext *ctx = enc::newContext(requestContextEntries(nameSpace));
+    EncResult result;
+    enc::bindResult(result, response);
+    try {
+        const CMPIStatus status = call(mi, ctx, &result.cmpi);
+        response.rc = status.rc;
+        if (status.msg != nullptr) response.message = messageOf(status);
+    } catch (...) {
+        response.rc = CMPI_RC_ERR_FAILED;
+        response.message = "provider " + provider + " let an exception escape through CMPI";
+    }
+}
+
+bool Broker::State::deliver(const std::string &nameSpace, const Instance &indication) {
+    std::lock_guard<std::mutex> lock(subscriberMutex);
+    bool accepted = true;
+    for (auto &entry : subscribers) {
+        if (!entry.second(nameSpace, indication)) accepted = false;
+    }
+    return accepted;
+}
+
+void Broker::State::shutdown() {
+    std::vector<LoadedInterface> loaded;
+    {
+        std::lock_guard<std::recursive_mutex> lock(loadMutex);
+        if (shutDown) return;
+        shutDown = true;
+        loaded = interfaces;
+    }
+    for (auto it = loaded.rbegin(); it != loaded.rend(); ++it) {
+        if (it->mi == nullptr) continue;
+        Response ignored;
+        callProvider(it->provider, it->kind, "root/cimv2", ignored,
+                     [&](void *mi, const CMPIContext *ctx, const CMPIResult *) {
+                         return cleanupInterface(mi, it->kind, ctx);
+                     });
+        if (!ignored.ok()) {
+            std::fprintf(stderr, "tvxbroker: cleanup of provider %s answered %d\n",
+                         it->provider.c_str(), static_cast<int>(ignored.rc));
+        }
+    }
+    {
+        std::lock_guard<std::mutex> lock(threadMutex);
+        threadContexts.clear();
+        spareContexts.clear();
+    }
+    ObjectPool::processPool().releaseAll();
+    std::lock_guard<std::recursive_mutex> lock(loadMutex);
+    for (auto &entry : libraries) {
+        if (entry.second.handle != nullptr) dlclose(entry.second.handle);
+    }
+    libraries.clear();
+}
+
+}  // namespace tvxbroker

@@ -1,0 +1,70 @@
+// The embedded broker's state, shared by its request dispatch and by the
+// CMPI service tables providers call back into.
+#pragma once
+
+#include <map>
+#include <mutex>
+#include <string>
+#include <vector>
+
+#include "core/Broker.h"
+#include "core/EncObjects.h"
+
+namespace tvxbroker {
+
+extern const CMPIBrokerFT brokerFT;
+extern const CMPIBrokerEncFT brokerEncFT;
+extern const CMPIBrokerExtFT brokerExtFT;
+extern const CMPIBrokerMemFT brokerMemFT;
+
+struct LoadedInterface {
+    std::string provider;
+    InterfaceKind kind;
+    void *mi = nullptr;
+    std::string error;  // why there is no interface
+};
+
+struct LoadedLibrary {
+    void *handle = nullptr;
+    std::string error;
+};
+
+struct Broker::State {
+    explicit State(BrokerConfig configuration);
+
+    BrokerConfig config;
+    CMPIBroker cmpi{};
+
+    // Loading may recurse: a provider's initialize can make up-calls that
+    // load other providers on the same thread.
+    std::recursive_mutex loadMutex;
+    std::map<std::string, LoadedLibrary> libraries;  // by location
+    std::vector<LoadedInterface> interfaces;         // in the order obtained
+
+    std::mutex threadMutex;
+    std::vector<std::unique_ptr<ThreadContextState>> threadContexts;
+    std::vector<std::unique_ptr<EncContext>> spareContexts;
+
+    std::mutex subscriberMutex;
+    std::map<int, IndicationSubscriber> subscribers;
+    int nextSubscription = 1;
+
+    bool shutDown = false;
+
+    void *obtain(const std::string &provider, InterfaceKind kind, std::string *error);
+    LoadedLibrary &library(const std::string &location);
+    CMPIContext *prepareThreadContext(const EncContext &from);
+    // Runs one provider call in a request scope of its own.
+    void callProvider(const std::string &provider, InterfaceKind kind, const std::string &nameSpace,
+                      Response &response,
+                      const std::function<CMPIStatus(void *mi, const CMPIContext *ctx,
+                                                     const CMPIResult *rslt)> &call);
+    bool deliver(const std::string &nameSpace, const Instance &indication);
+    void shutdown();
+};
+
+std::vector<NamedValue> requestContextEntries(const std::string &nameSpace);
+
+inline Broker::State &stateOf(const CMPIBroker *mb) { return *static_cast<Broker::State *>(mb->hdl); }
+
+}  // namespace tvxbroker

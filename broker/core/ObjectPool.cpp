@@ -1,0 +1,57 @@
+#include "core/ObjectPool.h"
+
+
+namespace tvxbroker {
+
+std::atomic<std::size_t> ObjectPool::live{0};
+
+namespace {
+thread_local ObjectPool *currentPool = nullptr;
+}
+
+void ObjectPool::adopt(std::unique_ptr<PooledObject> object) {
+    object->pool = this;
+    PooledObject *key = object.get();
+    std::lock_guard<std::mutex> lock(mutex);
+    objects.emplace(key, std::move(object));
+    ++live;
+}
+
+void ObjectPool::release(PooledObject *object) {
+    std::unique_ptr<PooledObject> owned;
+    {
+        std::lock_guard<std::mutex> lock(mutex);
+        auto found = objects.find(object);
+        if (found == objects.end()) return;
+        owned = std::move(found->second);
+        objects.erase(found);
+    }
+    --live;
+}
+
+void ObjectPool::releaseAll() {
+    std::unordered_map<PooledObject *, std::unique_ptr<PooledObject>> doomed;
+    {
+        std::lock_guard<std::mutex> lock(mutex);
+        doomed.swap(objects);
+    }
+    live -= doomed.size();
+}
+
+std::size_t ObjectPool::size() const {
+    std::lock_guard<std::mutex> lock(mutex);
+    return objects.size();
+}
+
+ObjectPool &ObjectPool::current() { return currentPool != nullptr ? *currentPool : processPool(); }
+
+void ObjectPool::setCurrent(ObjectPool *pool) { currentPool = pool; }
+
+ObjectPool *ObjectPool::currentOrNull() { return currentPool; }
+
+ObjectPool &ObjectPool::processPool() {
+    static ObjectPool pool;
+    return pool;
+}
+
+}  // namespace tvxbroker

@@ -1,0 +1,86 @@
+#include "tvxcim/CommandLine.h"
+
+#include <cstdlib>
+#include <set>
+#include <sstream>
+
+namespace tvxcim {
+
+const char *const usageText =
+    "usage: tvxcim [options] <command> [argument]\n"
+    "commands:\n"
+    "  ei CLASS     instances of a class (CLASS or namespace:CLASS)\n"
+    "  ein CLASS    instance names of a class\n"
+    "  gi PATH      one instance, PATH as root/cimv2:Class.Key=\"value\",...\n"
+    "  ai PATH      associated instances      ain PATH   associated names\n"
+    "  ri PATH      association instances     rin PATH   association names\n"
+    "  demo         every served class and association, then the first indications\n"
+    "options:\n"
+    "  --provider-dir DIR    where provider libraries are found (repeatable)\n"
+    "  --registration FILE   sfcb provider registration\n"
+    "  --mof FILE            class declarations (repeatable)\n"
+    "  --properties A,B      property list (ei, gi, ai, ri); empty text: none\n"
+    "  --assoc-class C  --result-class C  --role R  --result-role R\n"
+    "  --seconds N           demo: wait at most N seconds for each first indication\n";
+
+namespace {
+
+std::vector<std::string> splitList(const std::string &text) {
+    std::vector<std::string> items;
+    std::stringstream stream(text);
+    std::string item;
+    while (std::getline(stream, item, ',')) {
+        if (!item.empty()) items.push_back(item);
+    }
+    return items;
+}
+
+double parseSeconds(const std::string &text) {
+    char *end = nullptr;
+    const double value = std::strtod(text.c_str(), &end);
+    if (text.empty() || *end != '\0' || !(value >= 0) || value > 86400) {
+        throw UsageError("--seconds takes a number of seconds from 0 to 86400, not '" + text + "'");
+    }
+    return value;
+}
+
+}  // namespace
+
+CommandLine parseCommandLine(const std::vector<std::string> &args) {
+    static const std::set<std::string> commands = {"ei", "ein", "gi",  "ai",  "ain",
+                                                   "ri", "rin", "demo"};
+    CommandLine line;
+    std::size_t i = 0;
+    auto value = [&](const std::string &option) -> std::string {
+        if (i + 1 >= args.size()) throw UsageError(option + " needs a value");
+        return args[++i];
+    };
+    for (; i < args.size() && args[i].rfind("--", 0) == 0; ++i) {
+        const std::string &option = args[i];
+        if (option == "--provider-dir") line.providerDirs.push_back(value(option));
+        else if (option == "--registration") line.registration = value(option);
+        else if (option == "--mof") line.mofFiles.push_back(value(option));
+        else if (option == "--properties") line.properties = splitList(value(option));
+        else if (option == "--assoc-class") line.assocClass = value(option);
+        else if (option == "--result-class") line.resultClass = value(option);
+        else if (option == "--role") line.role = value(option);
+        else if (option == "--result-role") line.resultRole = value(option);
+        else if (option == "--seconds") line.seconds = parseSeconds(value(option));
+        else throw UsageError("unknown option " + option);
+    }
+    if (i >= args.size()) throw UsageError("no command given");
+    line.command = args[i++];
+    if (commands.count(line.command) == 0) throw UsageError("unknown command " + line.command);
+    const bool needsArgument = line.command != "demo";
+    if (needsArgument) {
+        if (i >= args.size()) throw UsageError(line.command + " needs an argument");
+        line.argument = args[i++];
+    }
+    if (i < args.size()) throw UsageError("unexpected argument " + args[i]);
+    if (line.registration.empty()) throw UsageError("no provider registration: use --registration");
+    if (line.mofFiles.empty()) throw UsageError("no class declarations: use --mof");
+    if (line.providerDirs.empty()) throw UsageError("no provider directory: use --provider-dir");
+    return line;
+}
+
+}  // namespace tvxcim

@@ -1,0 +1,35 @@
+// The command line of tvxcim: options first, then a command and its
+// argument.
+#pragma once
+
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "core/Broker.h"
+
+namespace tvxcim {
+
+struct CommandLine {
+    std::vector<std::string> providerDirs;
+    std::string registration;
+    std::vector<std::string> mofFiles;
+    tvxbroker::PropertyList properties;
+    std::string assocClass;
+    std::string resultClass;
+    std::string role;
+    std::string resultRole;
+    double seconds = 10;  // how long demo waits for each first indication
+    std::string command;
+    std::string argument;
+};
+
+class UsageError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+CommandLine parseCommandLine(const std::vector<std::string> &args);
+extern const char *const usageText;
+
+}  // namespace tvxcim
