@@ -20,6 +20,8 @@ struct DateTime {
     bool interval = false;
 };
 
+bool operator==(const DateTime &a, const DateTime &b);
+
 // One value of any CMPI type. Only the member that the type selects is
 // meaningful; arrays keep their elements (each of the element type) in
 // `elements`.
@@ -46,6 +48,8 @@ struct CimValue {
     static CimValue makeReal(CMPIType type, double v);
     static CimValue makeDateTime(DateTime v);
     static CimValue makeReference(ObjectPath path);
+    static CimValue makeInstance(Instance instance);
+    static CimValue makeArray(CMPIType elementType, std::vector<CimValue> elements);
     static CimValue makeNull(CMPIType type);
 };
 
@@ -79,8 +83,8 @@ struct Instance {
 bool operator==(const Instance &a, const Instance &b);
 inline bool operator!=(const Instance &a, const Instance &b) { return !(a == b); }
 
-bool operator==(const DateTime &a, const DateTime &b);
-
 bool equalsIgnoreCase(const std::string &a, const std::string &b);
+std::string toLowerAscii(std::string s);
+bool isCimName(const std::string &s);  // letters, digits and '_', not starting with a digit
 
 }  // namespace tvxbroker

@@ -1,0 +1,22 @@
+// Literal text shared by the path text and MOF output.
+#pragma once
+
+#include <cstdint>
+#include <string>
+
+#include "model/CimValue.h"
+
+namespace tvxbroker {
+
+// A non-null scalar as literal text before quoting. `quoted` is set for text
+// that goes in quotes: strings, char16, datetime, and the path of a reference
+// or embedded instance. Booleans are TRUE/FALSE, integers decimal and reals
+// in their shortest exact form. False for a type without a literal.
+bool scalarText(const CimValue &scalar, std::string &text, bool &quoted);
+
+// A char16 code unit as UTF-8, and back: false unless `text` is exactly one
+// character of the basic multilingual plane.
+std::string char16Text(std::uint64_t codeUnit);
+bool readChar16(const std::string &text, std::uint64_t &codeUnit);
+
+}  // namespace tvxbroker

@@ -1,0 +1,91 @@
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <stdexcept>
+#include <string>
+
+#include "model/CimDateTime.h"
+
+namespace tvxbroker {
+namespace {
+
+constexpr std::uint64_t second = 1000000;
+constexpr std::uint64_t day = 86400 * second;
+
+struct TextCase {
+    std::string text;
+    DateTime value;
+};
+
+TEST(CimDateTime, CanonicalTextRoundTrips) {
+    const TextCase cases[] = {
+        {"19700101000000.000000+000", {0, false}},
+        {"20000229235959.999999+000", {(11016 * day) + 86399 * second + 999999, false}},
+        {"21000301000000.000000+000", {47541 * day, false}},
+        {"99991231235959.999999+000", {2932896 * day + 86399 * second + 999999, false}},
+        {"00000000000000.000000:000", {0, true}},
+        {"00000001020304.000005:000", {day + 7384 * second + 5, true}},
+        {"99999999235959.999999:000", {99999999 * day + 86399 * second + 999999, true}},
+    };
+    for (const TextCase &c : cases) {
+        EXPECT_EQ(formatCimDateTime(c.value), c.text);
+        DateTime parsed;
+        ASSERT_TRUE(parseCimDateTime(c.text, parsed)) << c.text;
+        EXPECT_EQ(parsed, c.value) << c.text;
+    }
+}
+
+TEST(CimDateTime, OffsetIsRemovedOnParse) {
+    const TextCase cases[] = {
+        {"20240101120000.000000+060", {19723 * day + 11 * 3600 * second, false}},
+        {"20240101120000.000000-090", {19723 * day + 13 * 3600 * second + 1800 * second, false}},
+        {"20231231230000.000000-120", {19723 * day + 3600 * second, false}},
+    };
+    for (const TextCase &c : cases) {
+        DateTime parsed;
+        ASSERT_TRUE(parseCimDateTime(c.text, parsed)) << c.text;
+        EXPECT_EQ(parsed, c.value) << c.text;
+    }
+}
+
+TEST(CimDateTime, MalformedTextIsRejectedAndLeavesValueAlone) {
+    const std::string cases[] = {
+        "",
+        "2024010112000.000000+000",
+        "202401011200000.000000+000",
+        "20240101120000,000000+000",
+        "2024010112000a.000000+000",
+        "20240101120000.000000*000",
+        "20240101120000.000000+0a0",
+        "20241301120000.000000+000",
+        "20240001120000.000000+000",
+        "20230229120000.000000+000",
+        "21000229120000.000000+000",
+        "20240431120000.000000+000",
+        "20240101240000.000000+000",
+        "20240101126000.000000+000",
+        "20240101120060.000000+000",
+        "2024****120000.000000+000",
+        "19691231235959.999999+000",
+        "19700101000000.000000+001",
+        "00000001020304.000005:001",
+        "00000001240000.000000:000",
+        " 0000001020304.000005:000",
+        "20240101120000.000000+000\n",
+        std::string("20240101120000.0000\0\00+000", 25),
+    };
+    for (const std::string &text : cases) {
+        DateTime value{42, true};
+        EXPECT_FALSE(parseCimDateTime(text, value)) << text;
+        EXPECT_EQ(value, (DateTime{42, true})) << text;
+    }
+}
+
+TEST(CimDateTime, UnwritableValuesThrow) {
+    EXPECT_THROW(formatCimDateTime({2932897 * day, false}), std::out_of_range);
+    EXPECT_THROW(formatCimDateTime({100000000 * day, true}), std::out_of_range);
+    EXPECT_THROW(formatCimDateTime({UINT64_MAX, false}), std::out_of_range);
+}
+
+}  // namespace
+}  // namespace tvxbroker

@@ -1,0 +1,198 @@
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <fstream>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "ErrorText.h"
+#include "model/ClassSchema.h"
+
+namespace tvxbroker {
+namespace {
+
+const char *const sampleMof = R"MOF(#pragma locale ("en_US")
+// A comment with "quotes" and [brackets]
+/* a block comment
+   class NotAClass { }; */
+Qualifier Key : boolean = false, Scope(property, reference), Flavor(DisableOverride, ToSubclass);
+Qualifier ValueMap : string[], Scope(property, method, parameter);
+
+[Abstract, Description ("The root. \"Quoted\" ] text, "
+    "concatenated; with { braces } and // no comment"), Version("2.0")]
+class TST_Base {
+    [Key, MaxLen (256), Description ("id")] string InstanceID;
+    string Caption = "default; value";
+    uint16 Codes[] = {1, 2, 3};
+    [Key (false)] boolean NotKey;
+    uint32 Reset([IN] boolean Force, [IN, OUT] string Messages[], [OUT] TST_Base REF Result);
+};
+
+[Association, Aggregation]
+class TST_Link {
+    [Key] TST_Base REF Antecedent;
+    [Key, Description("x")] TST_Base REF Dependent;
+};
+
+class TST_Derived : tst_base {
+    string InstanceID;
+    [Key] sint64 Serial;
+    real32 Ratio;
+    datetime Since;
+    char16 Letter;
+    uint8 Bytes[4];
+    real64 Ref;
+};
+
+[Indication] class TST_Event { string Message; };
+class TST_Alert : TST_Event { uint8 Severity; };
+
+instance of TST_Base as $base {
+    InstanceID = "a}b;c";
+    Codes = {4, 5};
+};
+)MOF";
+
+class ClassSchemaTest : public ::testing::Test {
+protected:
+    void SetUp() override { schema.loadText(sampleMof, "sample.mof"); }
+    ClassSchema schema;
+};
+
+TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
+    const ClassDecl *base = schema.find("tst_BASE");
+    ASSERT_NE(base, nullptr);
+    EXPECT_EQ(base->name, "TST_Base");
+    EXPECT_EQ(base->superclass, "");
+    ASSERT_EQ(base->properties.size(), 4u);  // the method is not a property
+
+    const ClassDecl *derived = schema.find("TST_Derived");
+    ASSERT_NE(derived, nullptr);
+    EXPECT_EQ(derived->superclass, "TST_Base");
+
+    struct Expected {
+        const char *cls, *prop;
+        CMPIType type;
+        const char *referenceClass;
+        bool key;
+    };
+    const Expected expected[] = {
+        {"TST_Base", "instanceid", CMPI_string, "", true},
+        {"TST_Base", "Caption", CMPI_string, "", false},
+        {"TST_Base", "Codes", CMPI_uint16A, "", false},
+        {"TST_Base", "NotKey", CMPI_boolean, "", false},
+        {"TST_Link", "Dependent", CMPI_ref, "TST_Base", true},
+        {"TST_Derived", "Serial", CMPI_sint64, "", true},
+        {"TST_Derived", "Ratio", CMPI_real32, "", false},
+        {"TST_Derived", "Since", CMPI_dateTime, "", false},
+        {"TST_Derived", "Letter", CMPI_char16, "", false},
+        {"TST_Derived", "Bytes", CMPI_uint8A, "", false},
+        {"TST_Derived", "Ref", CMPI_real64, "", false},
+        {"TST_Derived", "Caption", CMPI_string, "", false},
+        {"TST_Alert", "message", CMPI_string, "", false},
+    };
+    for (const Expected &e : expected) {
+        const PropertyDecl *p = schema.findProperty(e.cls, e.prop);
+        ASSERT_NE(p, nullptr) << e.cls << "." << e.prop;
+        EXPECT_EQ(p->type, e.type) << e.prop;
+        EXPECT_EQ(p->referenceClass, e.referenceClass) << e.prop;
+        EXPECT_EQ(p->key, e.key) << e.prop;
+    }
+    EXPECT_EQ(schema.findProperty("TST_Base", "Reset"), nullptr);
+    EXPECT_EQ(schema.findProperty("TST_Base", "Serial"), nullptr);
+    EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
+}
+
+TEST_F(ClassSchemaTest, HierarchyQueries) {
+    EXPECT_TRUE(schema.isA("tst_derived", "TST_BASE"));
+    EXPECT_TRUE(schema.isA("TST_Base", "TST_Base"));
+    EXPECT_FALSE(schema.isA("TST_Base", "TST_Derived"));
+    EXPECT_FALSE(schema.isA("Nope", "Nope"));
+    EXPECT_FALSE(schema.isA("TST_Derived", "Nope"));
+    EXPECT_EQ(schema.selfAndSubclasses("tst_base"), (std::vector<std::string>{"TST_Base", "TST_Derived"}));
+    EXPECT_TRUE(schema.selfAndSubclasses("Nope").empty());
+
+    EXPECT_TRUE(schema.isAssociation("TST_Link"));
+    EXPECT_FALSE(schema.isAssociation("TST_Base"));
+    EXPECT_TRUE(schema.isIndication("tst_alert"));
+    EXPECT_FALSE(schema.isIndication("TST_Link"));
+    EXPECT_FALSE(schema.isIndication("Nope"));
+}
+
+TEST_F(ClassSchemaTest, KeysComeBaseFirstWithOverridesOnce) {
+    const std::vector<PropertyDecl> keys = schema.keysOf("TST_Derived");
+    ASSERT_EQ(keys.size(), 2u);
+    EXPECT_EQ(keys[0].name, "InstanceID");
+    EXPECT_TRUE(keys[0].key);  // redeclared without Key, still a key
+    EXPECT_EQ(keys[1].name, "Serial");
+    EXPECT_EQ(schema.keysOf("TST_Link").size(), 2u);
+    EXPECT_TRUE(schema.keysOf("Nope").empty());
+}
+
+TEST_F(ClassSchemaTest, LoadsAccumulateAndFailedLoadsLeaveNothing) {
+    schema.loadText("class TST_More : TST_Alert { };", "more.mof");
+    EXPECT_TRUE(schema.isIndication("TST_More"));
+    EXPECT_THROW(schema.loadText("class TST_A {}; class TST_B : TST_Missing {};", "bad.mof"), std::runtime_error);
+    EXPECT_EQ(schema.find("TST_A"), nullptr);
+    schema.loadText("class TST_A {};", "again.mof");
+    EXPECT_NE(schema.find("TST_A"), nullptr);
+}
+
+std::string loadError(const std::string &text) {
+    ClassSchema schema;
+    schema.loadText("class Known { };", "known.mof");
+    return errorOf([&] { schema.loadText(text, "t.mof"); });
+}
+
+TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
+    const std::pair<std::string, std::string> cases[] = {
+        {"class A {\n/* never closed", "t.mof:2: unterminated comment"},
+        {"[Description(\"open\n)] class A {};", "t.mof:1: unterminated string"},
+        {"[D('x)] class A {};", "t.mof:1: unterminated character literal"},
+        {"class A {\n string s;\n", "t.mof:3: expected a property or method declaration, found end of input"},
+        {"class A { string s }; ", "t.mof:1: expected ';', found '}'"},
+        {"class A { strin s; };", "t.mof:1: unknown type 'strin'"},
+        {"class A { string s; uint8 S; };", "t.mof:1: property S declared twice in class A"},
+        {"class A : B { };", "t.mof:1: superclass B of A is not declared"},
+        {"\n\nclass known { };", "t.mof:3: class known is already declared"},
+        {"class A { }; class a { };", "t.mof:1: class a is already declared"},
+        {"[Key(] class A {};", "t.mof:1: expected ')', found ']'"},
+        {"class A {\n [Description(\"x\"", "t.mof:2: '(' never closed"},
+        {"[Key(}] class A {};", "t.mof:1: expected ')', found '}'"},
+        {"[Key class A {};", "t.mof:1: expected ',' or ']', found 'class'"},
+        {"[Key] Qualifier Key : boolean;",
+         "t.mof:1: expected a class, instance or qualifier declaration, found 'Qualifier'"},
+        {"instance A { };", "t.mof:1: expected 'of', found 'A'"},
+        {"Qualifier Key : boolean = false", "t.mof:1: expected ';', found end of input"},
+        {"#include \"x.mof\"", "t.mof:1: unknown directive '#include'"},
+        {"class A { string \x01; };", "t.mof:1: unexpected byte 0x01"},
+        {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
+        {"\x89PNG\r\n\x1a\n", "t.mof:1: unexpected byte 0x89"},
+        {"class A { } ;;", "t.mof:1: expected a class, instance or qualifier declaration, found ';'"},
+        {"class A { uint8 b[; };", "t.mof:1: expected ']', found ';'"},
+        {"class { };", "t.mof:1: expected a class name, found '{'"},
+    };
+    for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;
+}
+
+TEST(ClassSchemaErrors, EmptyAndCommentOnlyTextDeclareNothing) {
+    ClassSchema schema;
+    schema.loadText("", "empty.mof");
+    schema.loadText("\xEF\xBB\xBF// only a comment\n#pragma namespace(\"root/cimv2\")\n", "bom.mof");
+    EXPECT_TRUE(schema.selfAndSubclasses("CIM_ManagedElement").empty());
+}
+
+TEST(ClassSchemaErrors, FilesAreNamedInMessages) {
+    ClassSchema schema;
+    EXPECT_EQ(errorOf([&] { schema.loadFile("/nonexistent/x.mof"); }), "cannot read /nonexistent/x.mof");
+    EXPECT_EQ(errorOf([&] { schema.loadFile("/"); }), "cannot read /");
+
+    const std::string path = ::testing::TempDir() + "schema_test.mof";
+    std::ofstream(path) << "class F {\n  uint99 x;\n};\n";
+    EXPECT_EQ(errorOf([&] { schema.loadFile(path); }), path + ":2: unknown type 'uint99'");
+    std::remove(path.c_str());
+}
+
+}  // namespace
+}  // namespace tvxbroker

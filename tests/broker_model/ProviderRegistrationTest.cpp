@@ -1,0 +1,74 @@
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "ErrorText.h"
+#include "model/ProviderRegistration.h"
+
+namespace tvxbroker {
+namespace {
+
+TEST(ProviderRegistration, ReadsBlocks) {
+    const std::vector<ProviderRegistration> regs = parseRegistration(
+        "# sfcb registrations\n"
+        "\n"
+        "[TVX_Disk]\n"
+        "   provider: TvxDiskProvider\n"
+        "   location: tvxdisk\r\n"
+        "   type: instance method\n"
+        "   namespace: root/cimv2 root/interop\n"
+        "   group: tvx\n"
+        "   unload: never\n"
+        "  # between blocks\n"
+        "[TVX_DiskLink]\n"
+        "provider:TvxLinkProvider\n"
+        "location:  tvxlink\n"
+        "type:association\tindication\n"
+        "namespace: root/cimv2\n",
+        "reg");
+    ASSERT_EQ(regs.size(), 2u);
+    const ProviderRegistration &disk = regs[0];
+    EXPECT_EQ(disk.className, "TVX_Disk");
+    EXPECT_EQ(disk.providerName, "TvxDiskProvider");
+    EXPECT_EQ(disk.location, "tvxdisk");
+    EXPECT_TRUE(disk.instance);
+    EXPECT_TRUE(disk.method);
+    EXPECT_FALSE(disk.association);
+    EXPECT_FALSE(disk.indication);
+    EXPECT_EQ(disk.namespaces, (std::vector<std::string>{"root/cimv2", "root/interop"}));
+    const ProviderRegistration &link = regs[1];
+    EXPECT_EQ(link.location, "tvxlink");
+    EXPECT_TRUE(link.association && link.indication);
+    EXPECT_FALSE(link.instance || link.method);
+    EXPECT_TRUE(parseRegistration("", "empty").empty());
+}
+
+TEST(ProviderRegistration, ErrorsNameTheLine) {
+    const std::string block = "[C]\n provider: P\n location: l\n type: instance\n namespace: root/cimv2\n";
+    const std::pair<std::string, std::string> cases[] = {
+        {" provider: P\n", "reg:1: 'key: value' line before any [ClassName] block"},
+        {"[C]\n provider P\n", "reg:2: expected 'key: value'"},
+        {"[C]\n vendor: x\n", "reg:2: unknown key 'vendor'"},
+        {"[C]\n type: instance query\n", "reg:2: unknown provider type 'query'"},
+        {"[C]\n location: l\n type: instance\n namespace: n\n", "reg:1: block [C] has no provider"},
+        {"[C]\n provider: P\n type: instance\n namespace: n\n", "reg:1: block [C] has no location"},
+        {"[C]\n provider: P\n location: l\n type:\n namespace: n\n", "reg:1: block [C] has no type"},
+        {"[C]\n provider: P\n location: l\n type: method\n[D]\n", "reg:1: block [C] has no namespace"},
+        {block + "\n[c]\n", "reg:7: class c is registered twice"},
+        {"[C\n", "reg:1: expected '[ClassName]'"},
+        {"[]\n", "reg:1: expected '[ClassName]'"},
+        {"[A B]\n", "reg:1: expected '[ClassName]'"},
+        {std::string("[C]\n\0\x01\xff\n", 8), "reg:2: expected 'key: value'"},
+    };
+    for (const auto &c : cases) EXPECT_EQ(errorOf([&] { parseRegistration(c.first, "reg"); }), c.second) << c.first;
+}
+
+TEST(ProviderRegistration, MissingFile) {
+    EXPECT_EQ(errorOf([] { readRegistrationFile("/nonexistent/providerRegister"); }),
+              "cannot read /nonexistent/providerRegister");
+}
+
+}  // namespace
+}  // namespace tvxbroker
