@@ -24,14 +24,9 @@ CMPIContext *contextClone(const CMPIContext *ctx, CMPIStatus *rc) {
     return &copy.release()->cmpi;
 }
 
-EncContext *checked(const CMPIContext *ctx, CMPIStatus *rc) {
-    EncContext *context = contextOf(ctx);
-    setRc(rc, context == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return context;
-}
 
 CMPIData getEntry(const CMPIContext *ctx, const char *name, CMPIStatus *rc) {
-    EncContext *context = checked(ctx, rc);
+    EncContext *context = reportLookup(contextOf(ctx), rc);
     if (context == nullptr) return notFoundData();
     for (const NamedValue &entry : context->entries) {
         if (name != nullptr && entry.name == name) return toCmpi(entry.value);
@@ -42,7 +37,7 @@ CMPIData getEntry(const CMPIContext *ctx, const char *name, CMPIStatus *rc) {
 
 CMPIData getEntryAt(const CMPIContext *ctx, CMPICount index, CMPIString **name,
                     CMPIStatus *rc) {
-    EncContext *context = checked(ctx, rc);
+    EncContext *context = reportLookup(contextOf(ctx), rc);
     if (context == nullptr) return notFoundData();
     if (index >= context->entries.size()) {
         setRc(rc, CMPI_RC_ERR_NO_SUCH_PROPERTY, "entry index out of range");
@@ -53,7 +48,7 @@ CMPIData getEntryAt(const CMPIContext *ctx, CMPICount index, CMPIString **name,
 }
 
 CMPICount getEntryCount(const CMPIContext *ctx, CMPIStatus *rc) {
-    EncContext *context = checked(ctx, rc);
+    EncContext *context = reportLookup(contextOf(ctx), rc);
     return context == nullptr ? 0 : static_cast<CMPICount>(context->entries.size());
 }
 

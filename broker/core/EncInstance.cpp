@@ -23,14 +23,9 @@ CMPIInstance *instanceClone(const CMPIInstance *inst, CMPIStatus *rc) {
     return cloneOf(instanceOf(inst), rc);
 }
 
-EncInstance *checked(const CMPIInstance *inst, CMPIStatus *rc) {
-    EncInstance *instance = instanceOf(inst);
-    setRc(rc, instance == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return instance;
-}
 
 CMPIData getProperty(const CMPIInstance *inst, const char *name, CMPIStatus *rc) {
-    EncInstance *instance = checked(inst, rc);
+    EncInstance *instance = reportLookup(instanceOf(inst), rc);
     if (instance == nullptr) return notFoundData();
     const CimValue *value = name != nullptr ? instance->value.property(name) : nullptr;
     if (value == nullptr) {
@@ -42,7 +37,7 @@ CMPIData getProperty(const CMPIInstance *inst, const char *name, CMPIStatus *rc)
 
 CMPIData getPropertyAt(const CMPIInstance *inst, CMPICount index, CMPIString **name,
                        CMPIStatus *rc) {
-    EncInstance *instance = checked(inst, rc);
+    EncInstance *instance = reportLookup(instanceOf(inst), rc);
     if (instance == nullptr) return notFoundData();
     if (index >= instance->value.properties.size()) {
         setRc(rc, CMPI_RC_ERR_NO_SUCH_PROPERTY, "property index out of range");
@@ -54,7 +49,7 @@ CMPIData getPropertyAt(const CMPIInstance *inst, CMPICount index, CMPIString **n
 }
 
 CMPICount getPropertyCount(const CMPIInstance *inst, CMPIStatus *rc) {
-    EncInstance *instance = checked(inst, rc);
+    EncInstance *instance = reportLookup(instanceOf(inst), rc);
     return instance == nullptr ? 0 : static_cast<CMPICount>(instance->value.properties.size());
 }
 
@@ -84,7 +79,7 @@ CMPIStatus setProperty(const CMPIInstance *inst, const char *name, const CMPIVal
 }
 
 CMPIObjectPath *getObjectPath(const CMPIInstance *inst, CMPIStatus *rc) {
-    EncInstance *instance = checked(inst, rc);
+    EncInstance *instance = reportLookup(instanceOf(inst), rc);
     return instance == nullptr ? nullptr : newObjectPath(instance->value.path);
 }
 

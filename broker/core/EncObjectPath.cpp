@@ -10,11 +10,6 @@ CMPIObjectPath *pathClone(const CMPIObjectPath *op, CMPIStatus *rc) {
     return cloneOf(pathOf(op), rc);
 }
 
-EncObjectPath *checked(const CMPIObjectPath *op, CMPIStatus *rc) {
-    EncObjectPath *path = pathOf(op);
-    setRc(rc, path == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return path;
-}
 
 CMPIStatus setText(CMPIObjectPath *op, std::string ObjectPath::*member, const char *text) {
     EncObjectPath *path = pathOf(op);
@@ -24,7 +19,7 @@ CMPIStatus setText(CMPIObjectPath *op, std::string ObjectPath::*member, const ch
 }
 
 CMPIString *getText(const CMPIObjectPath *op, std::string ObjectPath::*member, CMPIStatus *rc) {
-    EncObjectPath *path = checked(op, rc);
+    EncObjectPath *path = reportLookup(pathOf(op), rc);
     return path == nullptr ? nullptr : newString(path->value.*member);
 }
 
@@ -65,7 +60,7 @@ CMPIStatus addKey(CMPIObjectPath *op, const char *name, const CMPIValue *value, 
 }
 
 CMPIData getKey(const CMPIObjectPath *op, const char *name, CMPIStatus *rc) {
-    EncObjectPath *path = checked(op, rc);
+    EncObjectPath *path = reportLookup(pathOf(op), rc);
     if (path == nullptr) return notFoundData();
     const CimValue *key = name != nullptr ? path->value.key(name) : nullptr;
     if (key == nullptr) {
@@ -79,7 +74,7 @@ CMPIData getKey(const CMPIObjectPath *op, const char *name, CMPIStatus *rc) {
 
 CMPIData getKeyAt(const CMPIObjectPath *op, CMPICount index, CMPIString **name,
                   CMPIStatus *rc) {
-    EncObjectPath *path = checked(op, rc);
+    EncObjectPath *path = reportLookup(pathOf(op), rc);
     if (path == nullptr) return notFoundData();
     if (index >= path->value.keys.size()) {
         setRc(rc, CMPI_RC_ERR_NO_SUCH_PROPERTY, "key index out of range");
@@ -93,7 +88,7 @@ CMPIData getKeyAt(const CMPIObjectPath *op, CMPICount index, CMPIString **name,
 }
 
 CMPICount getKeyCount(const CMPIObjectPath *op, CMPIStatus *rc) {
-    EncObjectPath *path = checked(op, rc);
+    EncObjectPath *path = reportLookup(pathOf(op), rc);
     return path == nullptr ? 0 : static_cast<CMPICount>(path->value.keys.size());
 }
 
@@ -131,7 +126,7 @@ CMPIData noParameterQualifier(const CMPIObjectPath *, const char *, const char *
 }
 
 CMPIString *pathToString(const CMPIObjectPath *op, CMPIStatus *rc) {
-    EncObjectPath *path = checked(op, rc);
+    EncObjectPath *path = reportLookup(pathOf(op), rc);
     if (path == nullptr) return nullptr;
     try {
         return newString(formatPath(path->value));

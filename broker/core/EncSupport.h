@@ -37,6 +37,13 @@ Object *lookup(const Handle *handle, const Table *table) {
     return static_cast<Object *>(handle->hdl);
 }
 
+// The object behind a handle, with rc saying whether there was one.
+template <class Object>
+Object *reportLookup(Object *object, CMPIStatus *rc) {
+    setRc(rc, object == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
+    return object;
+}
+
 // A copy the caller owns and frees with release.
 template <class Object>
 decltype(Object::cmpi) *cloneOf(const Object *original, CMPIStatus *rc) {

@@ -23,24 +23,19 @@ char *stringCharPtr(const CMPIString *s, CMPIStatus *rc) {
 CMPIStatus arrayRelease(CMPIArray *a) { return releaseOf(arrayOf(a)); }
 CMPIArray *arrayClone(const CMPIArray *a, CMPIStatus *rc) { return cloneOf(arrayOf(a), rc); }
 
-EncArray *checkedArray(const CMPIArray *a, CMPIStatus *rc) {
-    EncArray *array = arrayOf(a);
-    setRc(rc, array == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return array;
-}
 
 CMPICount arraySize(const CMPIArray *a, CMPIStatus *rc) {
-    EncArray *array = checkedArray(a, rc);
+    EncArray *array = reportLookup(arrayOf(a), rc);
     return array == nullptr ? 0 : static_cast<CMPICount>(array->value.elements.size());
 }
 
 CMPIType arraySimpleType(const CMPIArray *a, CMPIStatus *rc) {
-    EncArray *array = checkedArray(a, rc);
+    EncArray *array = reportLookup(arrayOf(a), rc);
     return array == nullptr ? CMPIType(CMPI_null) : array->value.elementType();
 }
 
 CMPIData arrayElementAt(const CMPIArray *a, CMPICount index, CMPIStatus *rc) {
-    EncArray *array = checkedArray(a, rc);
+    EncArray *array = reportLookup(arrayOf(a), rc);
     if (array == nullptr) return notFoundData();
     if (index >= array->value.elements.size()) {
         setRc(rc, CMPI_RC_ERR_NO_SUCH_PROPERTY, "array index out of range");
@@ -75,24 +70,19 @@ CMPIDateTime *dateTimeClone(const CMPIDateTime *d, CMPIStatus *rc) {
     return cloneOf(dateTimeOf(d), rc);
 }
 
-EncDateTime *checkedDateTime(const CMPIDateTime *d, CMPIStatus *rc) {
-    EncDateTime *dt = dateTimeOf(d);
-    setRc(rc, dt == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return dt;
-}
 
 CMPIUint64 dateTimeBinary(const CMPIDateTime *d, CMPIStatus *rc) {
-    EncDateTime *dt = checkedDateTime(d, rc);
+    EncDateTime *dt = reportLookup(dateTimeOf(d), rc);
     return dt == nullptr ? 0 : dt->value.microseconds;
 }
 
 CMPIString *dateTimeString(const CMPIDateTime *d, CMPIStatus *rc) {
-    EncDateTime *dt = checkedDateTime(d, rc);
+    EncDateTime *dt = reportLookup(dateTimeOf(d), rc);
     return dt == nullptr ? nullptr : newString(formatCimDateTime(dt->value));
 }
 
 CMPIBoolean dateTimeIsInterval(const CMPIDateTime *d, CMPIStatus *rc) {
-    EncDateTime *dt = checkedDateTime(d, rc);
+    EncDateTime *dt = reportLookup(dateTimeOf(d), rc);
     return dt != nullptr && dt->value.interval ? 1 : 0;
 }
 
@@ -102,14 +92,9 @@ CMPIEnumeration *enumerationClone(const CMPIEnumeration *e, CMPIStatus *rc) {
     return cloneOf(enumerationOf(e), rc);
 }
 
-EncEnumeration *checkedEnumeration(const CMPIEnumeration *e, CMPIStatus *rc) {
-    EncEnumeration *en = enumerationOf(e);
-    setRc(rc, en == nullptr ? CMPI_RC_ERR_INVALID_HANDLE : CMPI_RC_OK);
-    return en;
-}
 
 CMPIData enumerationNext(const CMPIEnumeration *e, CMPIStatus *rc) {
-    EncEnumeration *en = checkedEnumeration(e, rc);
+    EncEnumeration *en = reportLookup(enumerationOf(e), rc);
     if (en == nullptr) return notFoundData();
     if (en->next >= en->items.size()) {
         setRc(rc, CMPI_RC_ERR_NO_SUCH_PROPERTY, "no more elements");
@@ -119,12 +104,12 @@ CMPIData enumerationNext(const CMPIEnumeration *e, CMPIStatus *rc) {
 }
 
 CMPIBoolean enumerationHasNext(const CMPIEnumeration *e, CMPIStatus *rc) {
-    EncEnumeration *en = checkedEnumeration(e, rc);
+    EncEnumeration *en = reportLookup(enumerationOf(e), rc);
     return en != nullptr && en->next < en->items.size() ? 1 : 0;
 }
 
 CMPIArray *enumerationToArray(const CMPIEnumeration *e, CMPIStatus *rc) {
-    EncEnumeration *en = checkedEnumeration(e, rc);
+    EncEnumeration *en = reportLookup(enumerationOf(e), rc);
     if (en == nullptr) return nullptr;
     const CMPIType elementType = en->items.empty() ? CMPIType(CMPI_instance) : en->items[0].type;
     CimValue array = CimValue::makeNull(static_cast<CMPIType>(elementType | CMPI_ARRAY));

@@ -25,67 +25,59 @@
 
 #define CMProviderBase(pn) CmpiProviderBase base##pn
 
-#define CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                  \
-    CmpiBaseMI *provider = base##pn.getBaseMI();              \
-    if (provider == nullptr) {                                \
-        CmpiBroker wrappedBroker(broker);                     \
-        provider = new cn(wrappedBroker, context);            \
-        provider->setProviderBase(&base##pn);                 \
-        provider->initialize(context);                        \
-        base##pn.setBaseMI(provider);                         \
+// The steps every factory shares; `announce` runs between recording the
+// provider and handing it out.
+#define CMPI_FACTORY_BODY(cn, pn, MIType, table, announce)     \
+    static MIType mi;                                          \
+    CmpiContext context(ctx);                                  \
+    mi.ft = &table;                                            \
+    CmpiBaseMI *provider = base##pn.getBaseMI();               \
+    if (provider == nullptr) {                                 \
+        CmpiBroker wrappedBroker(broker);                      \
+        provider = new cn(wrappedBroker, context);             \
+        provider->setProviderBase(&base##pn);                  \
+        provider->initialize(context);                         \
+        base##pn.setBaseMI(provider);                          \
+    }                                                          \
+    announce;                                                  \
+    mi.hdl = provider;                                         \
+    base##pn.incUseCount();                                    \
+    return &mi;
+
+#define CMInstanceMIFactory(cn, pn)                                                          \
+    CMPI_FACTORY_EXPORT CMPIInstanceMI *pn##_Create_InstanceMI(                              \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                   \
+        static const CMPIInstanceMIFT table = {                                              \
+            CMPICurrentVersion,                 CMPICurrentVersion,                          \
+            "instance" #pn,                     CmpiBaseMI::driveBaseCleanup,                \
+            CmpiInstanceMI::driveEnumInstanceNames, CmpiInstanceMI::driveEnumInstances,      \
+            CmpiInstanceMI::driveGetInstance,   CmpiInstanceMI::driveCreateInstance,         \
+            CmpiInstanceMI::driveSetInstance,   CmpiInstanceMI::driveDeleteInstance,         \
+            CmpiInstanceMI::driveExecQuery};                                                 \
+        CMPI_FACTORY_BODY(cn, pn, CMPIInstanceMI, table,                                     \
+                          std::fprintf(stderr, "--- _Create_InstanceMI() %s\n",              \
+                                       typeid(CmpiBaseMI *).name()))                         \
     }
 
-#define CMInstanceMIFactory(cn, pn)                                                         \
-    CMPI_FACTORY_EXPORT CMPIInstanceMI *pn##_Create_InstanceMI(                             \
-        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                  \
-        static const CMPIInstanceMIFT table = {                                             \
-            CMPICurrentVersion,                 CMPICurrentVersion,                         \
-            "instance" #pn,                     CmpiBaseMI::driveBaseCleanup,               \
-            CmpiInstanceMI::driveEnumInstanceNames, CmpiInstanceMI::driveEnumInstances,     \
-            CmpiInstanceMI::driveGetInstance,   CmpiInstanceMI::driveCreateInstance,        \
-            CmpiInstanceMI::driveSetInstance,   CmpiInstanceMI::driveDeleteInstance,        \
-            CmpiInstanceMI::driveExecQuery};                                                \
-        static CMPIInstanceMI mi;                                                           \
-        CmpiContext context(ctx);                                                           \
-        mi.ft = &table;                                                                     \
-        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                                \
-        std::fprintf(stderr, "--- _Create_InstanceMI() %s\n", typeid(CmpiBaseMI *).name()); \
-        mi.hdl = provider;                                                                  \
-        base##pn.incUseCount();                                                             \
-        return &mi;                                                                         \
-    }
-
-#define CMAssociationMIFactory(cn, pn)                                                    \
-    CMPI_FACTORY_EXPORT CMPIAssociationMI *pn##_Create_AssociationMI(                     \
-        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                \
-        static const CMPIAssociationMIFT table = {                                        \
-            CMPICurrentVersion,                     CMPICurrentVersion,                   \
-            "association" #pn,                      CmpiBaseMI::driveBaseCleanup,         \
+#define CMAssociationMIFactory(cn, pn)                                                       \
+    CMPI_FACTORY_EXPORT CMPIAssociationMI *pn##_Create_AssociationMI(                        \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                   \
+        static const CMPIAssociationMIFT table = {                                           \
+            CMPICurrentVersion,                     CMPICurrentVersion,                      \
+            "association" #pn,                      CmpiBaseMI::driveBaseCleanup,            \
             CmpiAssociationMI::driveAssociators,    CmpiAssociationMI::driveAssociatorNames, \
             CmpiAssociationMI::driveReferences,     CmpiAssociationMI::driveReferenceNames}; \
-        static CMPIAssociationMI mi;                                                      \
-        CmpiContext context(ctx);                                                         \
-        mi.ft = &table;                                                                   \
-        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                              \
-        mi.hdl = provider;                                                                \
-        base##pn.incUseCount();                                                           \
-        return &mi;                                                                       \
+        CMPI_FACTORY_BODY(cn, pn, CMPIAssociationMI, table, (void)0)                         \
     }
 
-#define CMIndicationMIFactory(cn, pn)                                                        \
-    CMPI_FACTORY_EXPORT CMPIIndicationMI *pn##_Create_IndicationMI(                          \
-        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                   \
-        static const CMPIIndicationMIFT table = {                                            \
-            CMPICurrentVersion,                       CMPICurrentVersion,                    \
-            "indication" #pn,                         CmpiBaseMI::driveBaseCleanup,          \
-            CmpiIndicationMI::driveAuthorizeFilter,   CmpiIndicationMI::driveMustPoll,       \
-            CmpiIndicationMI::driveActivateFilter,    CmpiIndicationMI::driveDeActivateFilter, \
+#define CMIndicationMIFactory(cn, pn)                                                           \
+    CMPI_FACTORY_EXPORT CMPIIndicationMI *pn##_Create_IndicationMI(                             \
+        CMPIBroker *broker, const CMPIContext *ctx, CMPIStatus * /*rc*/) {                      \
+        static const CMPIIndicationMIFT table = {                                               \
+            CMPICurrentVersion,                       CMPICurrentVersion,                       \
+            "indication" #pn,                         CmpiBaseMI::driveBaseCleanup,             \
+            CmpiIndicationMI::driveAuthorizeFilter,   CmpiIndicationMI::driveMustPoll,          \
+            CmpiIndicationMI::driveActivateFilter,    CmpiIndicationMI::driveDeActivateFilter,  \
             CmpiIndicationMI::driveEnableIndications, CmpiIndicationMI::driveDisableIndications}; \
-        static CMPIIndicationMI mi;                                                          \
-        CmpiContext context(ctx);                                                            \
-        mi.ft = &table;                                                                      \
-        CMPI_FACTORY_OBTAIN_PROVIDER(cn, pn)                                                 \
-        mi.hdl = provider;                                                                   \
-        base##pn.incUseCount();                                                              \
-        return &mi;                                                                          \
+        CMPI_FACTORY_BODY(cn, pn, CMPIIndicationMI, table, (void)0)                             \
     }
