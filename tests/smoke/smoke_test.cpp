@@ -23,25 +23,6 @@ TEST(Smoke, RunningMachineMatchesTargetArchitecture) {
   EXPECT_THAT(std::string(info.machine), ::testing::MatchesRegex(TVX_SMOKE_MACHINE_REGEX));
 }
 
-class Clock {
- public:
-  virtual ~Clock() = default;
-  virtual long now() const = 0;
-};
-
-class MockClock : public Clock {
- public:
-  MOCK_METHOD(long, now, (), (const, override));
-};
-
-long elapsed_since(const Clock& clock, long start) { return clock.now() - start; }
-
-TEST(Smoke, MockedCollaboratorIsConsulted) {
-  MockClock clock;
-  EXPECT_CALL(clock, now()).WillOnce(::testing::Return(42));
-  EXPECT_EQ(elapsed_since(clock, 40), 2);
-}
-
 #if TVX_SMOKE_EXPECT_ASAN
 void write_past_end() {
   char* block = new char[4];

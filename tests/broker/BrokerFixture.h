@@ -1,0 +1,115 @@
+// A broker loaded with the test providers, and the helpers that keep the
+// tests about behaviour: building paths, comparing answers as a client
+// would, and waiting for delivered events.
+#pragma once
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <chrono>
+#include <condition_variable>
+#include <cstddef>
+#include <cstdint>
+#include <mutex>
+#include <string>
+#include <vector>
+
+#include "core/Broker.h"
+#include "model/PathText.h"
+
+namespace brokertest {
+
+using namespace tvxbroker;
+
+inline constexpr const char *kNs = "root/cimv2";
+
+// Only reached when something is wrong; a healthy run waits a period or two.
+inline constexpr std::chrono::milliseconds kPatience{30000};
+
+inline ObjectPath classPath(const std::string &cls) { return ObjectPath{"", kNs, cls, {}}; }
+
+inline ObjectPath keyed(const std::string &cls, const std::string &key, const std::string &value) {
+    return ObjectPath{"", kNs, cls, {{key, CimValue::makeString(value)}}};
+}
+
+inline ObjectPath widget(const std::string &name, const std::string &cls = "Test_Widget") {
+    return keyed(cls, "Name", name);
+}
+
+inline ObjectPath gadget(const std::string &widgetName) {
+    return keyed("Test_Gadget", "Id", "gadget-" + widgetName);
+}
+
+inline ObjectPath link(const ObjectPath &owner, const ObjectPath &part) {
+    return ObjectPath{"", kNs, "Test_WidgetGadget",
+                      {{"Owner", CimValue::makeReference(owner)}, {"Part", CimValue::makeReference(part)}}};
+}
+
+// Paths as text, sorted: what a client compares, whatever order answers come in.
+inline std::vector<std::string> texts(const std::vector<ObjectPath> &paths) {
+    std::vector<std::string> result;
+    for (const ObjectPath &path : paths) result.push_back(formatPath(path));
+    std::sort(result.begin(), result.end());
+    return result;
+}
+
+inline std::vector<std::string> texts(const std::vector<Instance> &instances) {
+    std::vector<ObjectPath> paths;
+    for (const Instance &inst : instances) paths.push_back(inst.path);
+    return texts(paths);
+}
+
+inline std::uint64_t unsignedOf(const Instance &inst, const char *property) {
+    const CimValue *value = inst.property(property);
+    EXPECT_NE(value, nullptr) << property;
+    return value == nullptr ? 0 : value->unsignedValue;
+}
+
+struct Delivery {
+    std::string nameSpace;
+    Instance event;
+};
+
+// Records delivered events, so that a test can wait for them with a deadline.
+class EventSink {
+public:
+    IndicationSubscriber subscriber(bool accept) {
+        return [this, accept](const std::string &nameSpace, const Instance &event) {
+            {
+                const std::lock_guard<std::mutex> lock(mutex);
+                deliveries.push_back({nameSpace, event});
+            }
+            arrived.notify_all();
+            return accept;
+        };
+    }
+
+    // False when `patience` runs out before `count` events have arrived.
+    bool waitFor(std::size_t count, std::chrono::milliseconds patience = kPatience) {
+        std::unique_lock<std::mutex> lock(mutex);
+        return arrived.wait_for(lock, patience, [&] { return deliveries.size() >= count; });
+    }
+
+    std::vector<Delivery> received() const {
+        const std::lock_guard<std::mutex> lock(mutex);
+        return deliveries;
+    }
+
+private:
+    mutable std::mutex mutex;
+    std::condition_variable arrived;
+    std::vector<Delivery> deliveries;
+};
+
+class BrokerTest : public testing::Test {
+protected:
+    static BrokerConfig testConfig() {
+        return loadBrokerConfig({TVX_TESTPROVIDER_DIR}, TVX_TESTPROVIDER_REG, {TVX_TESTPROVIDER_MOF});
+    }
+
+    EventSink sink;  // declared first: it must outlive every delivery the broker makes
+    Broker broker{testConfig()};
+};
+
+}  // namespace brokertest
