@@ -60,23 +60,56 @@ bool knownClass(const Broker::State &state, const std::string &className, Respon
 using InstanceCall = std::function<CMPIStatus(CMPIInstanceMI *, const CMPIContext *,
                                               const CMPIResult *, CMPIObjectPath *)>;
 
+struct InstanceTarget {
+    std::string provider;
+    std::string className;
+};
+
+// As sfcb does, an enumeration asks each provider once for every registered
+// class below the requested one, naming that class in the path; a request on
+// one instance asks the providers of its own class.
+std::vector<InstanceTarget> instanceTargets(const Broker::State &state, const ObjectPath &path,
+                                            bool withSubclasses) {
+    std::vector<InstanceTarget> targets;
+    if (!withSubclasses) {
+        for (const std::string &provider : providersFor(state, &ProviderRegistration::instance,
+                                                        path.className, path.nameSpace, false)) {
+            targets.push_back({provider, path.className});
+        }
+        return targets;
+    }
+    for (const ProviderRegistration &registration : state.config.registrations) {
+        if (!registration.instance || !servesNamespace(registration, path.nameSpace) ||
+            !state.config.schema.isA(registration.className, path.className)) {
+            continue;
+        }
+        bool known = false;
+        for (const InstanceTarget &target : targets) {
+            known = known || (target.provider == registration.providerName &&
+                              equalsIgnoreCase(target.className, registration.className));
+        }
+        if (!known) targets.push_back({registration.providerName, registration.className});
+    }
+    return targets;
+}
+
 // Asks every instance provider in turn, stopping at the first error.
 Response askInstanceProviders(Broker::State &state, const ObjectPath &path, bool withSubclasses,
                               const InstanceCall &call) {
     Response response;
     if (!knownClass(state, path.className, response)) return response;
-    const std::vector<std::string> providers =
-        providersFor(state, &ProviderRegistration::instance, path.className, path.nameSpace,
-                     withSubclasses);
-    if (providers.empty() && !withSubclasses) {
+    const std::vector<InstanceTarget> targets = instanceTargets(state, path, withSubclasses);
+    if (targets.empty() && !withSubclasses) {
         response.rc = CMPI_RC_ERR_NOT_SUPPORTED;
         response.message = "no instance provider serves class " + path.className;
     }
-    for (const std::string &provider : providers) {
-        state.callProvider(provider, InterfaceKind::Instance, path.nameSpace, response,
+    for (const InstanceTarget &target : targets) {
+        ObjectPath targetPath = path;
+        targetPath.className = target.className;
+        state.callProvider(target.provider, InterfaceKind::Instance, path.nameSpace, response,
                            [&](void *mi, const CMPIContext *ctx, const CMPIResult *rslt) {
                                return call(static_cast<CMPIInstanceMI *>(mi), ctx, rslt,
-                                           enc::newObjectPath(path));
+                                           enc::newObjectPath(targetPath));
                            });
         if (!response.ok()) break;
     }

@@ -1,0 +1,71 @@
+#include "ethernet/GetPnicDetails.h"
+
+#include <cstring>
+
+#include "ethernet/AdapterRecord.h"
+#include "ethernet/LinkSettings.h"
+#include "frame/BoundedText.h"
+#include "platform/ParamList.h"
+
+namespace EthernetProvider {
+namespace {
+
+constexpr int adapterListNode = 70;
+constexpr int adapterRecordNode = 72;
+constexpr int adapterMtuNode = 74;
+constexpr unsigned int failed = 1;
+
+uint32_t littleEndian32(const unsigned char (&bytes)[4]) {
+    return uint32_t(bytes[0]) | uint32_t(bytes[1]) << 8 | uint32_t(bytes[2]) << 16 |
+           uint32_t(bytes[3]) << 24;
+}
+
+enum class Step { added, stop, fail };
+
+Step readAdapter(PRB_ParamList *adapters, int index, std::vector<PnicDetails> &pnics) {
+    char *name = nullptr;
+    if (PRB_ParamListGetString(adapters, index, &name) != 0 || name == nullptr) return Step::fail;
+
+    // A list that cannot be made ends the walk with what was read so far.
+    platform::ParamList params(PRB_ParamListCreate(1, 1));
+    if (!params) return Step::stop;
+    if (PRB_ParamListAddString(params.get(), name) != 0) return Step::fail;
+
+    unsigned char mtu[4] = {};
+    if (PRB_Get(adapterMtuNode, params.get(), mtu, sizeof mtu) != 0) return Step::fail;
+    unsigned char record[adapterRecordSize] = {};
+    if (PRB_Get(adapterRecordNode, params.get(), record, sizeof record) != 0) return Step::fail;
+    params.reset();
+
+    PnicDetails details;
+    std::memset(&details, 0, sizeof details);
+    frame::copyBounded(details.name, name);
+    details.mtu = littleEndian32(mtu);
+    queryLinkSettings(name, details);
+    decodeAdapterRecord(record, details);
+    pnics.push_back(details);
+    return Step::added;
+}
+
+}  // namespace
+
+unsigned int getPnicDetails(std::vector<PnicDetails> &pnics) {
+    char workArea[21] = {};
+    int signatureWord = 0;
+    if (PRB_CheckSig(workArea, sizeof workArea, &signatureWord) != 0) return failed;
+
+    platform::ParamList adapters;
+    if (PRB_GetInstanceListAlloc(adapterListNode, nullptr, adapters.receive()) != 0) return failed;
+
+    const int count = PRB_ParamListUsedCount(adapters.get());
+    for (int index = 0; index < count; ++index) {
+        switch (readAdapter(adapters.get(), index, pnics)) {
+            case Step::added: break;
+            case Step::stop: return 0;
+            case Step::fail: return failed;
+        }
+    }
+    return 0;
+}
+
+}  // namespace EthernetProvider
