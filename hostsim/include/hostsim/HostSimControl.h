@@ -1,0 +1,57 @@
+/* Control of the stand-in platform libraries, for tests and tools: which host
+ * profile is served, and how many parameter lists are alive. Exported from
+ * libosksysinfo.so beside the PRB_ functions; a real host has none of it. */
+#pragma once
+
+#include <stddef.h>
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* Statuses returned by the stand-in's PRB_ functions (0 is success). Callers
+ * on a real host only test for non-zero; tests use them to tell why. */
+enum HostSimStatus {
+    HOSTSIM_STATUS_OK = 0,
+    HOSTSIM_STATUS_BAD_ARGUMENT = 1, /* null pointer, negative size or index, wrong parameter shape */
+    HOSTSIM_STATUS_NO_PROFILE = 2,   /* the host profile could not be read */
+    HOSTSIM_STATUS_UNKNOWN_NODE = 3, /* no such node, or the node has no instance list / no value */
+    HOSTSIM_STATUS_BAD_SIZE = 4,     /* buffer size differs from the node's record size */
+    HOSTSIM_STATUS_NOT_FOUND = 5,    /* no such instance, or index past the end of a list */
+    HOSTSIM_STATUS_WRONG_TYPE = 6,   /* list entry of the other type, or an integer beyond 32 bits */
+    HOSTSIM_STATUS_INJECTED = 7      /* a fault of the profile failed this call */
+};
+
+/* Each loader returns 0, or non-zero with a one-line reason written into
+ * error (truncated to errorSize, always terminated; error may be null). A
+ * failed load leaves the served profile as it was. Loading a profile resets
+ * the call counters of its faults. */
+int HostSim_LoadProfileText(const char *json, char *error, size_t errorSize);
+/* The reason starts with the path: "<path>: <reason>". */
+int HostSim_LoadProfileFile(const char *path, char *error, size_t errorSize);
+/* Validates a profile file without serving it. */
+int HostSim_CheckProfileFile(const char *path, char *error, size_t errorSize);
+
+/* Back to the state at process start: the next call loads the profile named
+ * by TVX_HOST_PROFILE, or the built-in default when it is unset or empty. */
+void HostSim_ResetProfile(void);
+
+/* The built-in default profile as JSON text (static storage). */
+const char *HostSim_DefaultProfileText(void);
+
+/* Sets *hasConsole non-zero on a "Corla" host (one with a service console).
+ * When no profile can be read, sets it to 0 and returns HOSTSIM_STATUS_NO_PROFILE. */
+int HostSim_HasServiceConsole(int *hasConsole);
+
+/* Parameter lists handed out (PRB_ParamListCreate, PRB_GetInstanceListAlloc)
+ * and destroyed since the process started; live = created - destroyed.
+ * Destroying anything that is not a live list (twice, or a foreign pointer)
+ * frees nothing and is counted as foreign. */
+size_t HostSim_LiveListCount(void);
+size_t HostSim_CreatedListCount(void);
+size_t HostSim_DestroyedListCount(void);
+size_t HostSim_ForeignDestroyCount(void);
+
+#ifdef __cplusplus
+}
+#endif

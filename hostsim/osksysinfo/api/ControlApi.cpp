@@ -1,0 +1,84 @@
+// The control API: choosing the served profile, and the list counts.
+#include <cstdio>
+#include <exception>
+#include <string>
+
+#include "api/ExportedApi.h"
+#include "profile/DefaultProfile.h"
+#include "profile/ProfileReader.h"
+#include "serving/ListRegistry.h"
+#include "serving/ProfileStore.h"
+
+using namespace hostsim;
+
+namespace {
+
+void report(const char *reason, char *error, size_t errorSize) {
+    if (error != nullptr && errorSize > 0) std::snprintf(error, errorSize, "%s", reason);
+}
+
+int refuse(const char *reason, char *error, size_t errorSize) {
+    report(reason, error, errorSize);
+    return 1;
+}
+
+// Runs `read` and reports its failure: 0 on success, 1 otherwise.
+template <typename Read>
+int attempt(Read read, char *error, size_t errorSize) {
+    try {
+        read();
+        report("", error, errorSize);
+        return 0;
+    } catch (const std::exception &failure) {
+        return refuse(failure.what(), error, errorSize);
+    }
+}
+
+}  // namespace
+
+int HostSim_LoadProfileText(const char *json, char *error, size_t errorSize) {
+    if (json == nullptr) return refuse("no profile text", error, errorSize);
+    return attempt([json] { ProfileStore::instance().serve(parseProfile(json)); }, error, errorSize);
+}
+
+int HostSim_LoadProfileFile(const char *path, char *error, size_t errorSize) {
+    if (path == nullptr) return refuse("no profile path", error, errorSize);
+    return attempt([path] { ProfileStore::instance().serve(readProfileFile(path)); }, error, errorSize);
+}
+
+int HostSim_CheckProfileFile(const char *path, char *error, size_t errorSize) {
+    if (path == nullptr) return refuse("no profile path", error, errorSize);
+    return attempt([path] { readProfileFile(path); }, error, errorSize);
+}
+
+void HostSim_ResetProfile(void) {
+    ProfileStore::instance().reset();
+}
+
+const char *HostSim_DefaultProfileText(void) {
+    return defaultProfileText();
+}
+
+int HostSim_HasServiceConsole(int *hasConsole) {
+    if (hasConsole == nullptr) return HOSTSIM_STATUS_BAD_ARGUMENT;
+    const std::shared_ptr<const HostProfile> profile = ProfileStore::instance().current();
+    *hasConsole = profile && profile->serviceConsole ? 1 : 0;
+    return profile ? HOSTSIM_STATUS_OK : HOSTSIM_STATUS_NO_PROFILE;
+}
+
+size_t HostSim_LiveListCount(void) {
+    const ListCounts counts = ListRegistry::instance().counts();
+    return counts.created - counts.destroyed;
+}
+
+size_t HostSim_CreatedListCount(void) {
+    return ListRegistry::instance().counts().created;
+}
+
+size_t HostSim_DestroyedListCount(void) {
+    return ListRegistry::instance().counts().destroyed;
+}
+
+size_t HostSim_ForeignDestroyCount(void) {
+    return ListRegistry::instance().counts().foreign;
+}

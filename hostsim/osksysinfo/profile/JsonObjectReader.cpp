@@ -1,0 +1,131 @@
+#include "profile/JsonObjectReader.h"
+
+#include <cctype>
+#include <limits>
+#include <utility>
+
+#include "profile/ProfileError.h"
+
+namespace hostsim {
+
+namespace {
+
+// What a wrong value was, short enough for a one-line message.
+std::string describe(const nlohmann::json &value) {
+    if (value.is_structured()) return std::string("an ") + value.type_name();
+    std::string text = value.dump();
+    constexpr std::size_t longest = 40;
+    if (text.size() > longest) text = text.substr(0, longest) + "...";
+    return text;
+}
+
+std::optional<std::uint64_t> parseHex(const std::string &text) {
+    if (text.size() < 3 || text[0] != '0' || (text[1] != 'x' && text[1] != 'X')) return std::nullopt;
+    std::uint64_t value = 0;
+    for (std::size_t i = 2; i < text.size(); ++i) {
+        const unsigned char c = static_cast<unsigned char>(text[i]);
+        if (!std::isxdigit(c) || value > std::numeric_limits<std::uint64_t>::max() / 16) return std::nullopt;
+        const int digit = std::isdigit(c) ? c - '0' : std::tolower(c) - 'a' + 10;
+        value = value * 16 + static_cast<std::uint64_t>(digit);
+    }
+    return value;
+}
+
+}  // namespace
+
+JsonObjectReader::JsonObjectReader(const nlohmann::json &object, std::string path)
+    : object_(object), path_(std::move(path)) {
+    if (!object_.is_object()) {
+        throw ProfileError((path_.empty() ? std::string("profile") : path_) + ": expected an object, got " +
+                           describe(object_));
+    }
+}
+
+std::string JsonObjectReader::fieldPath(const char *key) const {
+    return path_.empty() ? key : path_ + "." + key;
+}
+
+void JsonObjectReader::fail(const char *key, const std::string &problem) const {
+    throw ProfileError(fieldPath(key) + ": " + problem);
+}
+
+const nlohmann::json *JsonObjectReader::field(const char *key) {
+    read_.insert(key);
+    const auto found = object_.find(key);
+    return found == object_.end() ? nullptr : &*found;
+}
+
+std::optional<std::string> JsonObjectReader::text(const char *key) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    if (!value->is_string()) fail(key, "expected a text, got " + describe(*value));
+    return value->get<std::string>();
+}
+
+std::optional<std::string> JsonObjectReader::textOrInteger(const char *key) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    if (value->is_string()) return value->get<std::string>();
+    if (value->is_number_unsigned()) return std::to_string(value->get<std::uint64_t>());
+    if (value->is_number_integer()) return std::to_string(value->get<std::int64_t>());
+    fail(key, "expected a text or an integer, got " + describe(*value));
+}
+
+std::optional<std::uint64_t> JsonObjectReader::unsignedInteger(const char *key, std::uint64_t min,
+                                                               std::uint64_t max) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    std::optional<std::uint64_t> number;
+    if (value->is_number_unsigned()) number = value->get<std::uint64_t>();
+    if (value->is_string()) number = parseHex(value->get<std::string>());
+    if (!number || *number < min || *number > max) {
+        fail(key, "expected an integer from " + std::to_string(min) + " to " + std::to_string(max) +
+                      " (or hexadecimal text such as \"0x1f\"), got " + describe(*value));
+    }
+    return number;
+}
+
+std::optional<std::int64_t> JsonObjectReader::signedInteger(const char *key) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    const bool fits = value->is_number_integer() &&
+                      (!value->is_number_unsigned() ||
+                       value->get<std::uint64_t>() <= std::uint64_t(std::numeric_limits<std::int64_t>::max()));
+    if (!fits) fail(key, "expected a 64-bit signed integer, got " + describe(*value));
+    return value->get<std::int64_t>();
+}
+
+std::optional<bool> JsonObjectReader::boolean(const char *key) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    if (!value->is_boolean()) fail(key, "expected true or false, got " + describe(*value));
+    return value->get<bool>();
+}
+
+std::optional<std::uint8_t> JsonObjectReader::flag(const char *key) {
+    const nlohmann::json *value = field(key);
+    if (!value) return std::nullopt;
+    if (value->is_boolean()) return std::uint8_t(value->get<bool>() ? 1 : 0);
+    if (value->is_number_unsigned() && value->get<std::uint64_t>() <= 255) {
+        return static_cast<std::uint8_t>(value->get<std::uint64_t>());
+    }
+    fail(key, "expected true, false or an integer from 0 to 255, got " + describe(*value));
+}
+
+void JsonObjectReader::eachObject(const char *key, const std::function<void(JsonObjectReader &element)> &read) {
+    const nlohmann::json *value = field(key);
+    if (!value) return;
+    if (!value->is_array()) fail(key, "expected an array, got " + describe(*value));
+    for (std::size_t i = 0; i < value->size(); ++i) {
+        JsonObjectReader element((*value)[i], fieldPath(key) + "[" + std::to_string(i) + "]");
+        read(element);
+    }
+}
+
+void JsonObjectReader::finish() const {
+    for (const auto &item : object_.items()) {
+        if (read_.count(item.key()) == 0) fail(item.key().c_str(), "unknown field");
+    }
+}
+
+}  // namespace hostsim

@@ -1,0 +1,78 @@
+#include <cstdint>
+#include <functional>
+
+#include "HostSimTesting.h"
+
+namespace hostsim_test {
+namespace {
+
+class HostSimParamLists : public HostSimTest {};
+
+TEST_F(HostSimParamLists, EntriesReadBackByTheirType) {
+    const List list = listOf({"vmk0"});
+    for (int64_t value : {INT64_C(-5), INT64_C(1) << 40, int64_t(INT32_MIN)}) {
+        ASSERT_EQ(PRB_ParamListAddInt(list.get(), value), HOSTSIM_STATUS_OK);
+    }
+    // index, PRB_ParamListGetString status and text, PRB_ParamListGetInt32 status and value
+    const std::tuple<int, int, const char *, int, int32_t> reads[] = {
+        {0, HOSTSIM_STATUS_OK, "vmk0", HOSTSIM_STATUS_WRONG_TYPE, 0},
+        {1, HOSTSIM_STATUS_WRONG_TYPE, nullptr, HOSTSIM_STATUS_OK, -5},
+        {2, HOSTSIM_STATUS_WRONG_TYPE, nullptr, HOSTSIM_STATUS_WRONG_TYPE, 0},
+        {3, HOSTSIM_STATUS_WRONG_TYPE, nullptr, HOSTSIM_STATUS_OK, INT32_MIN},
+        {4, HOSTSIM_STATUS_NOT_FOUND, nullptr, HOSTSIM_STATUS_NOT_FOUND, 0},
+        {-1, HOSTSIM_STATUS_NOT_FOUND, nullptr, HOSTSIM_STATUS_NOT_FOUND, 0},
+    };
+    const auto orNull = [](const char *text) { return std::string(text ? text : "null"); };
+    for (const auto &[index, stringStatus, text, int32Status, value] : reads) {
+        char sentinel = 0;
+        char *gotText = &sentinel;
+        int32_t gotValue = 77;
+        EXPECT_EQ(PRB_ParamListGetString(list.get(), index, &gotText), stringStatus) << index;
+        EXPECT_EQ(PRB_ParamListGetInt32(list.get(), index, &gotValue), int32Status) << index;
+        EXPECT_EQ(gotValue, value) << index;
+        PRB_Param *param = PRB_ParamListGetParam(list.get(), index);
+        EXPECT_EQ(param != nullptr, index >= 0 && index < 4) << index;
+        EXPECT_EQ(orNull(gotText), orNull(text)) << index;
+        EXPECT_EQ(orNull(PRB_ParamGetString(param)), orNull(text)) << index;
+    }
+}
+
+TEST_F(HostSimParamLists, TextsStayValidUntilTheirEntryIsRemoved) {
+    const List list = listOf({"vmk0"});
+    char *first = nullptr;
+    ASSERT_EQ(PRB_ParamListGetString(list.get(), 0, &first), HOSTSIM_STATUS_OK);
+    for (int i = 0; i < 1000; ++i) ASSERT_EQ(PRB_ParamListAddString(list.get(), "fe80::1"), HOSTSIM_STATUS_OK);
+    EXPECT_STREQ(first, "vmk0");
+    for (int i = 1000; i >= 0; --i) ASSERT_EQ(PRB_ParamListRemoveLastParam(list.get()), HOSTSIM_STATUS_OK) << i;
+    EXPECT_EQ(PRB_ParamListUsedCount(list.get()), 0);
+    EXPECT_EQ(PRB_ParamListRemoveLastParam(list.get()), HOSTSIM_STATUS_NOT_FOUND);
+}
+
+TEST_F(HostSimParamLists, EveryListHandedOutIsCounted) {
+    serve(host({{{"name", "vmnic0"}}}));
+    PRB_ParamList *kept = nullptr;
+    int notAList = 0;
+    // what, step, then the created, destroyed and foreign counts since the start
+    const std::tuple<const char *, std::function<void()>, std::size_t, std::size_t, std::size_t> steps[] = {
+        {"create", [&] { kept = PRB_ParamListCreate(1, 1); }, 1, 0, 0},
+        {"destroy", [&] { PRB_ParamListDestroy(kept); }, 1, 1, 0},
+        {"destroy again", [&] { PRB_ParamListDestroy(kept); }, 1, 1, 1},
+        {"destroy a foreign pointer",
+         [&] { PRB_ParamListDestroy(reinterpret_cast<PRB_ParamList *>(&notAList)); }, 1, 1, 2},
+        {"instance list", [] { instanceList(70); }, 2, 2, 2},
+        {"failed instance list", [] { instanceList(74); }, 2, 2, 2},
+        {"refused create", [] { PRB_ParamListCreate(1, -1); }, 2, 2, 2},
+    };
+    const std::size_t created = HostSim_CreatedListCount();
+    const std::size_t destroyed = HostSim_DestroyedListCount();
+    const std::size_t foreign = HostSim_ForeignDestroyCount();
+    for (const auto &[what, step, createdSince, destroyedSince, foreignSince] : steps) {
+        step();
+        EXPECT_EQ(HostSim_CreatedListCount() - created, createdSince) << what;
+        EXPECT_EQ(HostSim_DestroyedListCount() - destroyed, destroyedSince) << what;
+        EXPECT_EQ(HostSim_ForeignDestroyCount() - foreign, foreignSince) << what;
+    }
+}
+
+}  // namespace
+}  // namespace hostsim_test

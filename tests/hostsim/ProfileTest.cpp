@@ -1,0 +1,133 @@
+#include <gmock/gmock.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+
+#include "HostSimTesting.h"
+
+namespace hostsim_test {
+namespace {
+
+using ::testing::StartsWith;
+
+std::string withAdapter(const char *adapterJson) {
+    return std::string(R"({"hostType": "Corlai", "adapters": [)") + adapterJson + "]}";
+}
+
+std::string withFault(const char *faultJson) {
+    return std::string(R"({"hostType": "Corlai", "faults": [)") + faultJson + "]}";
+}
+
+class HostSimProfiles : public HostSimTest {};
+
+TEST_F(HostSimProfiles, GarbledProfilesAreRefusedNamingTheField) {
+    const std::string range = "adapters[0].speedMbps: expected an integer from 0 to 65535 (or hexadecimal text";
+    const std::pair<std::string, std::string> cases[] = {
+        {"{", "not valid JSON: line 1, column 2: syntax error"},
+        {"{}", "hostType: missing"},
+        {R"({"hostType": "corla"})", R"(hostType: expected "Corla" or "Corlai", got "corla")"},
+        {R"({"hostType": "Corla", "hostName": 5})", "hostName: expected a text, got 5"},
+        {R"({"hostType": "Corla", "adaptres": []})", "adaptres: unknown field"},
+        {R"({"hostType": "Corla", "adapters": {}})", "adapters: expected an array, got an object"},
+        {withAdapter("{}"), "adapters[0].name: missing"},
+        {withAdapter(R"({"name": "a", "speedMbps": 70000})"), range + " such as \"0x1f\"), got 70000"},
+        {withAdapter(R"({"name": "a", "speedMbps": -1})"), range},
+        {withAdapter(R"({"name": "a", "speedMbps": "0x1zz"})"), range},
+        {withAdapter(R"({"name": "a", "linkUp": "yes"})"), "adapters[0].linkUp: expected true, false or an integer"},
+        {withAdapter(R"({"name": "a", "count": 3}, {"name": "a1"})"),
+         R"(adapters[1].name: duplicate adapter name "a1")"},
+        {withFault(R"({"call": "PRB_Nope"})"), R"(faults[0].call: unknown call "PRB_Nope" (known: PRB_CheckSig,)"},
+        {withFault(R"({"call": "PRB_Get", "noList": true})"), "faults[0].noList: unknown field"},
+        {withFault(R"({"call": "PRB_Get", "instance": {}})"), "faults[0].instance: expected a text or an integer"},
+        {withFault(R"({"call": "PRB_CheckSig", "nth": 0})"), "faults[0].nth: expected an integer from 1 to"},
+    };
+    serve(host({{{"name", "kept"}}}));
+    for (const auto &[json, message] : cases) EXPECT_THAT(loadError(json), StartsWith(message)) << json;
+    EXPECT_EQ(servedAdapterNames(), std::vector<std::string>{"kept"}) << "a refused profile replaces nothing";
+}
+
+TEST_F(HostSimProfiles, FilesAreServedOrRefusedWithTheirPath) {
+    const std::string good = ::testing::TempDir() + "hostsim-good.json";
+    const std::string garbled = ::testing::TempDir() + "hostsim-garbled.json";
+    const std::string missing = ::testing::TempDir() + "hostsim-missing.json";
+    std::ofstream(good) << host({{{"name", "from-file"}}});
+    std::ofstream(garbled) << R"({"hostType": )";
+    const std::pair<std::string, std::string> refusals[] = {
+        {garbled, garbled + ": not valid JSON: line 1, column 14"},
+        {missing, missing + ": No such file or directory"},
+        {::testing::TempDir(), ::testing::TempDir() + ": not a regular file"},
+    };
+    char error[256];
+    for (const auto &[path, message] : refusals) {
+        EXPECT_NE(HostSim_CheckProfileFile(path.c_str(), error, sizeof error), 0);
+        EXPECT_THAT(error, StartsWith(message));
+        EXPECT_NE(HostSim_LoadProfileFile(path.c_str(), error, sizeof error), 0);
+        EXPECT_THAT(error, StartsWith(message));
+    }
+    EXPECT_EQ(HostSim_CheckProfileFile(good.c_str(), error, sizeof error), 0);
+    EXPECT_NE(servedAdapterNames(), std::vector<std::string>{"from-file"}) << "checking serves nothing";
+    EXPECT_EQ(HostSim_LoadProfileFile(good.c_str(), nullptr, 0), 0);
+    EXPECT_EQ(servedAdapterNames(), std::vector<std::string>{"from-file"});
+    for (const auto &example : std::filesystem::directory_iterator(HOSTSIM_PROFILE_DIR)) {
+        EXPECT_EQ(HostSim_CheckProfileFile(example.path().c_str(), error, sizeof error), 0) << error;
+    }
+}
+
+TEST_F(HostSimProfiles, HostTypeDecidesTheServiceConsole) {
+    for (const auto &[hostType, inCosFlag, osIsOsk] : {std::tuple{"Corlai", 0, 1}, std::tuple{"Corla", 1, 0}}) {
+        serve({{"hostType", hostType}});
+        int inCos = -1;
+        EXPECT_EQ(OskuserCompat_InCOS(&inCos), 0);
+        EXPECT_EQ(inCos, inCosFlag) << hostType;
+        EXPECT_EQ(HostType_OSIsOSK(), osIsOsk) << hostType;
+    }
+}
+
+// TVX_HOST_PROFILE as each test sets it, unset afterwards.
+class HostSimEnvironment : public HostSimTest {
+protected:
+    void TearDown() override {
+        unsetenv("TVX_HOST_PROFILE");
+        HostSimTest::TearDown();
+    }
+    static void select(const std::string &path) {
+        setenv("TVX_HOST_PROFILE", path.c_str(), 1);
+        HostSim_ResetProfile();
+    }
+};
+
+TEST_F(HostSimEnvironment, DefaultProfileUnlessAFileIsSelected) {
+    const nlohmann::json file = nlohmann::json::parse(std::ifstream(HOSTSIM_PROFILE_DIR "/default.json"));
+    EXPECT_EQ(nlohmann::json::parse(HostSim_DefaultProfileText()), file);
+    std::vector<std::string> names;
+    for (const nlohmann::json &adapter : file["adapters"]) names.push_back(adapter["name"]);
+    unsetenv("TVX_HOST_PROFILE");
+    HostSim_ResetProfile();
+    EXPECT_EQ(servedAdapterNames(), names);
+    select("");
+    EXPECT_EQ(servedAdapterNames(), names);
+    EXPECT_EQ(HostType_OSIsOSK(), 1);
+    select(HOSTSIM_PROFILE_DIR "/corla.json");
+    EXPECT_EQ(HostType_OSIsOSK(), 0);
+}
+
+TEST_F(HostSimEnvironment, UnreadableProfileFailsTheSignatureCheckAndSaysSoOnce) {
+    const std::string path = ::testing::TempDir() + "hostsim-absent.json";
+    select(path);
+    ::testing::internal::CaptureStderr();
+    char area[21];
+    int status = -1;
+    EXPECT_EQ(PRB_CheckSig(area, sizeof area, &status), HOSTSIM_STATUS_NO_PROFILE);
+    EXPECT_EQ(PRB_CheckSig(area, sizeof area, &status), HOSTSIM_STATUS_NO_PROFILE);
+    EXPECT_EQ(instanceList(70, &status), nullptr);
+    EXPECT_EQ(status, HOSTSIM_STATUS_NO_PROFILE);
+    int hasConsole = -1;
+    EXPECT_EQ(OskuserCompat_InCOS(&hasConsole), HOSTSIM_STATUS_NO_PROFILE);
+    EXPECT_EQ(hasConsole, 0);
+    EXPECT_NE(listOf({"vmnic0"}), nullptr) << "lists still work";
+    EXPECT_EQ(::testing::internal::GetCapturedStderr(), "hostsim: " + path + ": No such file or directory\n");
+}
+
+}  // namespace
+}  // namespace hostsim_test
