@@ -41,6 +41,10 @@ struct BrokerConfig {
     std::vector<std::string> providerDirs;  // searched for lib<location>.so
     std::vector<ProviderRegistration> registrations;
     ClassSchema schema;
+    // Receives what the broker reports on its own: a provider that cannot be
+    // loaded, a cleanup that failed. Unset, each goes to stderr as
+    // "tvxbroker: <text>". Called from whichever thread hit the problem.
+    std::function<void(const std::string &)> diagnostics;
 };
 
 // Receives each delivered indication; returning false refuses it, and the

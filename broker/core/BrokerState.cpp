@@ -98,6 +98,14 @@ LoadedLibrary &Broker::State::library(const std::string &location) {
     return loaded;
 }
 
+void Broker::State::report(const std::string &text) const {
+    if (config.diagnostics) {
+        config.diagnostics(text);
+    } else {
+        std::fprintf(stderr, "tvxbroker: %s\n", text.c_str());
+    }
+}
+
 void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std::string *error) {
     std::lock_guard<std::recursive_mutex> lock(loadMutex);
     for (const LoadedInterface &known : interfaces) {
@@ -133,7 +141,7 @@ void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std
             loaded.error = "provider " + provider + ": factory " + symbol + " failed with an exception";
         }
     }
-    if (!loaded.error.empty()) std::fprintf(stderr, "tvxbroker: %s\n", loaded.error.c_str());
+    if (!loaded.error.empty()) report(loaded.error);
     if (error != nullptr) *error = loaded.error;
     interfaces.push_back(loaded);
     return loaded.mi;
@@ -199,8 +207,8 @@ void Broker::State::shutdown() {
                          return cleanupInterface(mi, it->kind, ctx);
                      });
         if (!ignored.ok()) {
-            std::fprintf(stderr, "tvxbroker: cleanup of provider %s answered %d\n",
-                         it->provider.c_str(), static_cast<int>(ignored.rc));
+            report("cleanup of provider " + it->provider + " answered " +
+                   std::to_string(static_cast<int>(ignored.rc)));
         }
     }
     {

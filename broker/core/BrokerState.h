@@ -51,6 +51,7 @@ struct Broker::State {
 
     bool shutDown = false;
 
+    void report(const std::string &text) const;
     void *obtain(const std::string &provider, InterfaceKind kind, std::string *error);
     LoadedLibrary &library(const std::string &location);
     CMPIContext *prepareThreadContext(const EncContext &from);

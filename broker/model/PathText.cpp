@@ -48,7 +48,7 @@ public:
         const std::string className = readName();
         if (className.empty()) fail("empty class name", classStart);
         const ClassDecl *decl = schema_.find(className);
-        if (!decl) fail("unknown class " + className, classStart);
+        if (!decl) throw UnknownClassError(className, classStart);
         path.className = decl->name;
         if (atEnd()) return path;
         if (text_[pos_] != '.') fail(unexpectedHere(), pos_);
@@ -203,6 +203,9 @@ private:
 
 PathParseError::PathParseError(const std::string &problem, std::size_t position)
     : std::runtime_error(problem + " at position " + std::to_string(position)), position_(position) {}
+
+UnknownClassError::UnknownClassError(const std::string &className, std::size_t position)
+    : PathParseError("unknown class " + className, position), className_(className) {}
 
 std::string formatPath(const ObjectPath &path) {
     std::string out = path.nameSpace.empty() ? path.className : path.nameSpace + ":" + path.className;

@@ -22,6 +22,16 @@ private:
     std::size_t position_;
 };
 
+// The path names a class the schema does not declare.
+class UnknownClassError : public PathParseError {
+public:
+    UnknownClassError(const std::string &className, std::size_t position);
+    const std::string &className() const { return className_; }
+
+private:
+    std::string className_;
+};
+
 // Keys in stored order; a null key is written NULL, an embedded instance as
 // its path. Throws std::invalid_argument for an array key.
 std::string formatPath(const ObjectPath &path);

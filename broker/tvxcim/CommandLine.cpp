@@ -21,7 +21,18 @@ const char *const usageText =
     "  --mof FILE            class declarations (repeatable)\n"
     "  --properties A,B      property list (ei, gi, ai, ri); empty text: none\n"
     "  --assoc-class C  --result-class C  --role R  --result-role R\n"
-    "  --seconds N           demo: wait at most N seconds for each first indication\n";
+    "  --seconds N           demo: wait at most N seconds for each first indication\n"
+    "  --json                JSON instead of MOF, one object per line (see below)\n"
+    "  --help                this text\n"
+    "JSON: an instance is {\"className\", \"path\", \"properties\"}, a path\n"
+    "  {\"text\", \"namespace\", \"className\", \"keys\"}, where \"text\" is the PATH\n"
+    "  form above; properties and keys map each name to {\"type\", \"value\"}, the\n"
+    "  type being the MOF type name, \"reference\" or \"instance\", with \"[]\" for an\n"
+    "  array. NULL is null, an array a JSON array, a reference a path. uint64 and\n"
+    "  sint64 values are decimal strings, so that no JSON reader rounds them; other\n"
+    "  integers and reals are numbers (NaN and infinities as \"NaN\", \"Infinity\",\n"
+    "  \"-Infinity\"). Each demo section is one object with a \"section\" member.\n"
+    "exit status: 0 done, 1 bad input or a failed request, 2 a usage error\n";
 
 namespace {
 
@@ -42,6 +53,12 @@ double parseSeconds(const std::string &text) {
         throw UsageError("--seconds takes a number of seconds from 0 to 86400, not '" + text + "'");
     }
     return value;
+}
+
+CommandLine helpOnly() {
+    CommandLine line;
+    line.help = true;
+    return line;
 }
 
 }  // namespace
@@ -66,6 +83,8 @@ CommandLine parseCommandLine(const std::vector<std::string> &args) {
         else if (option == "--role") line.role = value(option);
         else if (option == "--result-role") line.resultRole = value(option);
         else if (option == "--seconds") line.seconds = parseSeconds(value(option));
+        else if (option == "--json") line.json = true;
+        else if (option == "--help") return helpOnly();
         else throw UsageError("unknown option " + option);
     }
     if (i >= args.size()) throw UsageError("no command given");

@@ -10,6 +10,9 @@
 
 namespace tvxcim {
 
+// The namespace of a class named without one, and of the demo's requests.
+inline constexpr const char *defaultNameSpace = "root/cimv2";
+
 struct CommandLine {
     std::vector<std::string> providerDirs;
     std::string registration;
@@ -20,6 +23,8 @@ struct CommandLine {
     std::string role;
     std::string resultRole;
     double seconds = 10;  // how long demo waits for each first indication
+    bool json = false;
+    bool help = false;  // nothing else is read then
     std::string command;
     std::string argument;
 };
@@ -29,6 +34,7 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// Throws UsageError with a one-line reason.
 CommandLine parseCommandLine(const std::vector<std::string> &args);
 extern const char *const usageText;
 

@@ -1,23 +1,15 @@
-// What each tvxcim command does with the broker, written to an output
-// stream; a failed request becomes a RequestFailed.
+// What each tvxcim command asks the broker, with the answers going to a
+// ResultWriter. Every class the command names is checked against the
+// schema before any request is made; bad input and a failed request throw
+// std::runtime_error with the one-line reason.
 #pragma once
-
-#include <ostream>
-#include <stdexcept>
 
 #include "core/Broker.h"
 #include "tvxcim/CommandLine.h"
+#include "tvxcim/ResultWriter.h"
 
 namespace tvxcim {
 
-class RequestFailed : public std::runtime_error {
-public:
-    using std::runtime_error::runtime_error;
-};
-
-void runCommand(tvxbroker::Broker &broker, const CommandLine &line, std::ostream &out);
-
-// "CMPI_RC_ERR_NOT_FOUND (6): text"
-std::string describeFailure(const tvxbroker::Response &response);
+void runCommand(tvxbroker::Broker &broker, const CommandLine &line, ResultWriter &writer);
 
 }  // namespace tvxcim

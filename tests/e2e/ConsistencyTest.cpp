@@ -1,0 +1,238 @@
+// Every class the registration serves, compared through the embedded broker
+// as a client would: instance names against the keys of the instances, each
+// name's instance against the enumerated one, and for every association the
+// names against the instances from an instance at each of its ends. Only the
+// differences listed in `expectedExceptions` are accepted, and each of those
+// must show exactly as described.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <map>
+#include <set>
+
+#include "ClientView.h"
+#include "SuiteFiles.h"
+#include "model/MofInstanceText.h"
+#include "model/PathText.h"
+#include "tvxcim/StatusText.h"
+
+namespace consistency {
+namespace {
+
+using namespace tvxbroker;
+using testing::UnorderedElementsAreArray;
+
+enum class Deviation {
+    ProviderUnavailable,        // every request for the class fails with CMPI_RC_ERR_FAILED
+    NoGetInstance,              // getInstance answers CMPI_RC_ERR_NOT_SUPPORTED
+    InstancePathWithFewerKeys,  // an instance's own path holds only some of its keys, maybe none
+};
+
+struct ExpectedException {
+    const char *className;
+    Deviation deviation;
+    const char *reason;
+};
+
+const ExpectedException expectedExceptions[] = {
+    {"Test_Missing", Deviation::ProviderUnavailable, "its provider library does not exist"},
+    {"Test_NoFactory", Deviation::ProviderUnavailable, "its provider has no factory in the library"},
+    {"Test_NullFactory", Deviation::ProviderUnavailable, "its provider's factory returns no interface"},
+    {"Test_ThrowingFactory", Deviation::ProviderUnavailable, "its provider's constructor throws"},
+    {"Test_WidgetGadget", Deviation::NoGetInstance, "the links are served by enumeration and traversal only"},
+    {"Test_EventCounter", Deviation::NoGetInstance, "the counter is served by enumeration only"},
+    {"Test_ProviderStats", Deviation::NoGetInstance, "the statistics are served by enumeration only"},
+};
+
+const ExpectedException *expected(const std::string &className, Deviation deviation) {
+    for (const ExpectedException &exception : expectedExceptions) {
+        if (exception.deviation == deviation && equalsIgnoreCase(exception.className, className)) return &exception;
+    }
+    return nullptr;
+}
+
+BrokerConfig suiteConfig() { return loadBrokerConfig({kProviderDir}, kRegistration, kMofFiles); }
+
+// Read while the tests are being listed; a registration that cannot be read
+// gives no classes, and RegistrationServesInstances says why.
+std::vector<std::string> servedClasses(bool ProviderRegistration::*kind) {
+    std::vector<std::string> classes;
+    std::set<std::string> seen;
+    try {
+        for (const ProviderRegistration &registration : readRegistrationFile(kRegistration)) {
+            if (registration.*kind && seen.insert(toLowerAscii(registration.className)).second) {
+                classes.push_back(registration.className);
+            }
+        }
+    } catch (const std::exception &) {
+        classes.clear();
+    }
+    return classes;
+}
+
+std::string failureOf(const Response &response) { return tvxcim::describeFailure(response); }
+
+// Before any provider is loaded, as under ctest so when run by hand.
+class SuiteVariables : public testing::Environment {
+public:
+    void SetUp() override {
+        for (const std::string &variable : kEnvironment) {
+            const std::size_t equals = variable.find('=');
+            ASSERT_EQ(setenv(variable.substr(0, equals).c_str(), variable.substr(equals + 1).c_str(), 1), 0)
+                << variable;
+        }
+    }
+};
+
+testing::Environment *const suiteVariables = testing::AddGlobalTestEnvironment(new SuiteVariables);
+
+TEST(ConsistencySuite, RegistrationServesInstances) {
+    ASSERT_NO_THROW(suiteConfig());
+    EXPECT_FALSE(servedClasses(&ProviderRegistration::instance).empty()) << kRegistration;
+}
+
+class ClientComparison : public testing::TestWithParam<std::string> {
+protected:
+    // In the first namespace the registration serves the class under test
+    // in; the classes at an association's ends are looked for there too.
+    ObjectPath classPath(const std::string &className) const {
+        for (const ProviderRegistration &registration : broker.registrations()) {
+            if (equalsIgnoreCase(registration.className, GetParam())) {
+                return ObjectPath{"", registration.namespaces.front(), className, {}};
+            }
+        }
+        ADD_FAILURE() << GetParam() << " is not registered";
+        return ObjectPath{"", "", className, {}};
+    }
+
+    const ClassSchema &schema() const { return broker.schema(); }
+
+    // The instance's own path is its name, but where an exception is listed.
+    void checkOwnPath(const Instance &instance) const {
+        const ObjectPath name = nameOf(instance, schema());
+        const ExpectedException *fewerKeys =
+            expected(instance.path.className, Deviation::InstancePathWithFewerKeys);
+        if (fewerKeys == nullptr) {
+            EXPECT_EQ(canonicalText(instance.path, schema()), canonicalText(name, schema()));
+            return;
+        }
+        EXPECT_LT(instance.path.keys.size(), name.keys.size()) << fewerKeys->reason;
+        ObjectPath carried = name;
+        carried.keys.clear();
+        for (const NamedValue &key : instance.path.keys) {
+            if (const CimValue *value = name.key(key.name)) carried.keys.push_back({key.name, *value});
+        }
+        EXPECT_EQ(canonicalText(instance.path, schema()), canonicalText(carried, schema())) << fewerKeys->reason;
+    }
+
+    // The names one request gave are those of the instances its twin gave.
+    void checkNamesOfInstances(const Response &names, const Response &instances) const {
+        ASSERT_TRUE(names.ok()) << failureOf(names);
+        ASSERT_TRUE(instances.ok()) << failureOf(instances);
+        EXPECT_THAT(canonicalTexts(names.paths, schema()),
+                    UnorderedElementsAreArray(canonicalNames(instances.instances, schema())));
+        for (const Instance &instance : instances.instances) checkOwnPath(instance);
+    }
+
+    Broker broker{suiteConfig()};
+};
+
+class ServedClass : public ClientComparison {};
+
+TEST_P(ServedClass, NamesAreTheKeysOfTheInstances) {
+    const Response names = broker.enumInstanceNames(classPath(GetParam()));
+    const Response instances = broker.enumInstances(classPath(GetParam()), std::nullopt);
+    if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
+        EXPECT_EQ(names.rc, CMPI_RC_ERR_FAILED) << unavailable->reason;
+        EXPECT_EQ(instances.rc, CMPI_RC_ERR_FAILED) << unavailable->reason;
+        return;
+    }
+    checkNamesOfInstances(names, instances);
+}
+
+TEST_P(ServedClass, EachNameGetsTheEnumeratedInstance) {
+    if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
+        GTEST_SKIP() << unavailable->reason;
+    }
+    const Response names = broker.enumInstanceNames(classPath(GetParam()));
+    const Response instances = broker.enumInstances(classPath(GetParam()), std::nullopt);
+    ASSERT_TRUE(names.ok()) << failureOf(names);
+    ASSERT_TRUE(instances.ok()) << failureOf(instances);
+    std::map<std::string, const Instance *> enumerated;
+    for (const Instance &instance : instances.instances) {
+        enumerated[canonicalText(nameOf(instance, schema()), schema())] = &instance;
+    }
+    const ExpectedException *noGet = expected(GetParam(), Deviation::NoGetInstance);
+    for (const ObjectPath &name : names.paths) {
+        const std::string text = canonicalText(name, schema());
+        const Response got = broker.getInstance(name, std::nullopt);
+        if (noGet != nullptr) {
+            EXPECT_EQ(got.rc, CMPI_RC_ERR_NOT_SUPPORTED) << text << ": " << noGet->reason;
+            continue;
+        }
+        ASSERT_TRUE(got.ok()) << text << ": " << failureOf(got);
+        ASSERT_EQ(got.instances.size(), 1U) << text;
+        const auto found = enumerated.find(text);
+        ASSERT_NE(found, enumerated.end()) << text << " has no enumerated instance";
+        EXPECT_EQ(got.instances.front(), *found->second)
+            << "got:\n" << formatInstanceMof(got.instances.front())
+            << "enumerated:\n" << formatInstanceMof(*found->second);
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(Registered, ServedClass, testing::ValuesIn(servedClasses(&ProviderRegistration::instance)),
+                         [](const auto &test) { return test.param; });
+
+// Each association is walked from the first instance at each of its ends
+// that takes part in one.
+class ServedAssociation : public ClientComparison {
+protected:
+    void SetUp() override {
+        if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
+            GTEST_SKIP() << unavailable->reason;
+        }
+        for (const Role &role : rolesOf(GetParam(), schema())) {
+            const Response names = broker.enumInstanceNames(classPath(role.referenceClass));
+            ASSERT_TRUE(names.ok()) << role.referenceClass << ": " << failureOf(names);
+            for (const ObjectPath &name : names.paths) {
+                const Response associated = broker.associatorNames(name, GetParam(), "", "", "");
+                if (associated.ok() && !associated.paths.empty()) {
+                    starts.push_back(name);
+                    break;
+                }
+            }
+        }
+        if (starts.empty()) GTEST_SKIP() << "no instance at either end takes part in " << GetParam();
+    }
+
+    std::vector<ObjectPath> starts;
+};
+
+TEST_P(ServedAssociation, AssociatorNamesAreTheKeysOfTheAssociators) {
+    for (const ObjectPath &start : starts) {
+        SCOPED_TRACE(formatPath(start));
+        const Response names = broker.associatorNames(start, GetParam(), "", "", "");
+        const Response instances = broker.associators(start, GetParam(), "", "", "", std::nullopt);
+        checkNamesOfInstances(names, instances);
+    }
+}
+
+TEST_P(ServedAssociation, ReferenceNamesAreTheKeysOfTheReferences) {
+    for (const ObjectPath &start : starts) {
+        SCOPED_TRACE(formatPath(start));
+        const Response names = broker.referenceNames(start, GetParam(), "");
+        const Response instances = broker.references(start, GetParam(), "", std::nullopt);
+        EXPECT_FALSE(names.paths.empty()) << "an instance that has associators has references too";
+        checkNamesOfInstances(names, instances);
+    }
+}
+
+// A registration may serve no association at all.
+GTEST_ALLOW_UNINSTANTIATED_PARAMETERIZED_TEST(ServedAssociation);
+INSTANTIATE_TEST_SUITE_P(Registered, ServedAssociation,
+                         testing::ValuesIn(servedClasses(&ProviderRegistration::association)),
+                         [](const auto &test) { return test.param; });
+
+}  // namespace
+}  // namespace consistency

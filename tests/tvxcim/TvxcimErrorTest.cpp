@@ -1,0 +1,124 @@
+// Every kind of bad input and failed request ends in exactly one line on
+// stderr, nothing on stdout and the documented exit status: 2 for a usage
+// error, 1 for everything else.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+
+#include "TvxcimRun.h"
+
+namespace {
+
+using namespace tvxcimtest;
+
+constexpr const char *kMissingFile = "/nonexistent/tvxcim-test-file";
+
+Args withFiles(const std::string &dir, const std::string &registration, const std::string &mof,
+               const Args &rest) {
+    Args args = {"--provider-dir", dir, "--registration", registration, "--mof", mof};
+    args.insert(args.end(), rest.begin(), rest.end());
+    return args;
+}
+
+struct ErrorCase {
+    const char *name;
+    Args args;
+    int status;
+    std::string message;
+};
+
+void PrintTo(const ErrorCase &test, std::ostream *os) { *os << test.name; }
+
+class TvxcimErrorTest : public testing::TestWithParam<ErrorCase> {};
+
+TEST_P(TvxcimErrorTest, EndsInOneLineAndItsStatus) {
+    const Outcome run = runWith(GetParam().args);
+    EXPECT_EQ(run.status, GetParam().status);
+    EXPECT_EQ(run.out, "");
+    EXPECT_EQ(run.err, "tvxcim: " + GetParam().message + "\n");
+}
+
+const std::string kUsageHint = " (tvxcim --help shows the usage)";
+
+INSTANTIATE_TEST_SUITE_P(
+    BadInput, TvxcimErrorTest,
+    testing::Values(
+        ErrorCase{"ValueNotQuoted", onTestProviders({"gi", "root/cimv2:Test_Widget.Name=zz"}), 1,
+                  "malformed object path 'root/cimv2:Test_Widget.Name=zz': "
+                  "value of Name must be quoted at position 28"},
+        ErrorCase{"PathWithoutNamespace", onTestProviders({"ain", R"(Test_Widget.Name="a")"}), 1,
+                  R"(malformed object path 'Test_Widget.Name="a"': missing ':' after the namespace at position 20)"},
+        ErrorCase{"KeyOfNoProperty", onTestProviders({"rin", R"(root/cimv2:Test_Widget.Id="a")"}), 1,
+                  R"(malformed object path 'root/cimv2:Test_Widget.Id="a"': class Test_Widget has no property Id at position 23)"},
+        ErrorCase{"UnknownClassInPath", onTestProviders({"gi", R"(root/cimv2:Test_Widgt.Name="a")"}), 1,
+                  R"(unknown class Test_Widgt in object path 'root/cimv2:Test_Widgt.Name="a"': no MOF file declares it)"},
+        ErrorCase{"UnknownClass", onTestProviders({"ei", "root/cimv2:Nope"}), 1,
+                  "unknown class Nope: no MOF file declares it"},
+        ErrorCase{"UnknownAssocClass", onTestProviders({"--assoc-class", "Nope", "ai", kAlpha}), 1,
+                  "unknown class Nope given to --assoc-class: no MOF file declares it"},
+        ErrorCase{"UnknownResultClass", onTestProviders({"--result-class", "Nope", "rin", kAlpha}), 1,
+                  "unknown class Nope given to --result-class: no MOF file declares it"},
+        ErrorCase{"EmptyClassName", onTestProviders({"ein", "root/cimv2:"}), 1,
+                  "malformed class name 'root/cimv2:': use CLASS or namespace:CLASS"},
+        ErrorCase{"MissingLibrary", onTestProviders({"ei", "Test_Missing"}), 1,
+                  "CMPI_RC_ERR_FAILED (1): provider MissingLib: provider library "
+                  "libtvxnosuchlibrary.so not found in the provider directories"},
+        ErrorCase{"MissingFactory", onTestProviders({"--json", "gi", R"(root/cimv2:Test_NoFactory.Name="x")"}), 1,
+                  "CMPI_RC_ERR_FAILED (1): provider NoSuchProvider: library libtvxtestprovider.so "
+                  "has no factory NoSuchProvider_Create_InstanceMI"},
+        ErrorCase{"FactoryReturnsNull", onTestProviders({"ein", "Test_NullFactory"}), 1,
+                  "CMPI_RC_ERR_FAILED (1): provider NullProvider: factory "
+                  "NullProvider_Create_InstanceMI returned no interface"},
+        ErrorCase{"FactoryThrows", onTestProviders({"ei", "Test_ThrowingFactory"}), 1,
+                  "CMPI_RC_ERR_FAILED (1): provider ThrowingProvider: factory "
+                  "ThrowingProvider_Create_InstanceMI failed with an exception"},
+        ErrorCase{"StatusWithMessage", onTestProviders({"gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
+                  "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
+        ErrorCase{"StatusWithoutMessage",
+                  onTestProviders({"gi", "root/cimv2:Test_ProviderStats.ProviderName=\"WidgetProvider\""}), 1,
+                  "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
+        ErrorCase{"StatusOfUpCall", onTestProviders({"--json", "ai", R"(root/cimv2:Test_Gadget.Id="gadget-zz")"}), 1,
+                  "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
+        ErrorCase{"MissingRegistration",
+                  withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+                  std::string("cannot read ") + kMissingFile},
+        ErrorCase{"GarbledRegistration",
+                  withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_MOF, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+                  std::string(TVX_TESTPROVIDER_MOF) + ":1: expected 'key: value'"},
+        ErrorCase{"MissingMof",
+                  withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_REG, kMissingFile, {"ei", "Test_Widget"}), 1,
+                  std::string("cannot read ") + kMissingFile},
+        ErrorCase{"MissingProviderDirectory",
+                  withFiles(kMissingFile, TVX_TESTPROVIDER_REG, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+                  std::string("provider directory ") + kMissingFile + " does not exist"},
+        ErrorCase{"NoCommand", onTestProviders({}), 2, "no command given" + kUsageHint},
+        ErrorCase{"UnknownCommand", onTestProviders({"list"}), 2, "unknown command list" + kUsageHint},
+        ErrorCase{"UnknownOption", onTestProviders({"--jsn", "ei", "Test_Widget"}), 2,
+                  "unknown option --jsn" + kUsageHint},
+        ErrorCase{"MissingArgument", onTestProviders({"gi"}), 2, "gi needs an argument" + kUsageHint},
+        ErrorCase{"NoRegistration", Args{"--provider-dir", "/tmp", "ei", "Test_Widget"}, 2,
+                  "no provider registration: use --registration" + kUsageHint}),
+    [](const auto &test) { return std::string(test.param.name); });
+
+TEST(TvxcimPreflightTest, RunsBeforeAnythingIsLoadedAndSeesTheCommandLine) {
+    std::string seenCommand;
+    const tvxcim::PreflightCheck hostReady = [&](const tvxcim::CommandLine &line) {
+        seenCommand = line.command;
+        throw std::runtime_error("host not ready");
+    };
+    const Outcome run = runWith(withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, kMissingFile, {"ein", "Test_Widget"}),
+                            {hostReady});
+    EXPECT_EQ(run.status, 1);
+    EXPECT_EQ(run.err, "tvxcim: host not ready\n");
+    EXPECT_EQ(seenCommand, "ein");
+}
+
+TEST(TvxcimHelpTest, PrintsTheUsageAndSucceeds) {
+    const Outcome run = runWith({"--json", "--help"});
+    EXPECT_EQ(run.status, 0);
+    EXPECT_EQ(run.out, tvxcim::usageText);
+    EXPECT_EQ(run.err, "");
+}
+
+}  // namespace
