@@ -1,9 +1,52 @@
 // tvxcim: a CIM client that runs the embedded broker in-process on a
-// provider registration and answers one request.
+// provider registration and answers one request. Without any of the
+// library options it serves the product library of this build, on the host
+// the stand-in platform libraries simulate.
+#include <algorithm>
+#include <cstdlib>
 #include <iostream>
+#include <sstream>
+#include <stdexcept>
 
+#include "hostsim/HostSimControl.h"
 #include "tvxcim/Tvxcim.h"
 
+namespace {
+
+bool namesItsLibrary(const std::vector<std::string> &args) {
+    return std::any_of(args.begin(), args.end(), [](const std::string &arg) {
+        return arg == "--provider-dir" || arg == "--registration" || arg == "--mof";
+    });
+}
+
+std::vector<std::string> withProductLibrary(std::vector<std::string> args) {
+    std::vector<std::string> options = {"--provider-dir", TVX_PRODUCT_PROVIDER_DIR,
+                                        "--registration", TVX_PRODUCT_REGISTRATION};
+    std::stringstream mofs(TVX_PRODUCT_MOFS);
+    for (std::string mof; std::getline(mofs, mof, ':');) {
+        options.push_back("--mof");
+        options.push_back(mof);
+    }
+    args.insert(args.begin(), options.begin(), options.end());
+    return args;
+}
+
+// A profile that cannot be read would only show as failed requests later.
+void checkHostProfile(const tvxcim::CommandLine &) {
+    const char *profile = std::getenv("TVX_HOST_PROFILE");
+    if (profile == nullptr || *profile == '\0') return;
+    char error[1024];
+    if (HostSim_CheckProfileFile(profile, error, sizeof error) != 0) {
+        throw std::runtime_error(std::string("host profile ") + error);
+    }
+}
+
+}  // namespace
+
 int main(int argc, char **argv) {
-    return tvxcim::runTvxcim(std::vector<std::string>(argv + 1, argv + argc), std::cout, std::cerr);
+    std::vector<std::string> args(argv + 1, argv + argc);
+    if (!namesItsLibrary(args)) args = withProductLibrary(std::move(args));
+    std::vector<tvxcim::PreflightCheck> checks = tvxcim::standardPreflightChecks();
+    checks.push_back(checkHostProfile);
+    return tvxcim::runTvxcim(args, std::cout, std::cerr, checks);
 }
