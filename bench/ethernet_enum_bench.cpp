@@ -24,8 +24,7 @@ void enumeratePorts(benchmark::State &state, const char *profileFile) {
         state.SkipWithError(error);
         return;
     }
-    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_MOF_DIR "/tvxprovider.reg",
-                                   {TVX_MOF_DIR "/cim_base.mof", TVX_MOF_DIR "/talvex_ethernet.mof"}));
+    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PRODUCT_REGISTRATION, {TVX_PRODUCT_MOFS}));
     const ObjectPath ports{"", "root/cimv2", "Talvex_EthernetPort", {}};
     std::size_t adapters = 0;
     for (auto _ : state) {

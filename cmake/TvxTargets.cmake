@@ -55,3 +55,24 @@ function(tvx_add_gtest target)
     DISCOVERY_TIMEOUT 300
     ${extra})
 endfunction()
+
+# Sets <out> to the MOF files the product library's classes need, in the
+# order a broker reads them: the CIM base classes, then every Talvex file.
+function(tvx_product_mofs out)
+  file(GLOB talvex_mofs CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/mof/talvex_*.mof)
+  list(SORT talvex_mofs)
+  set(${out} ${PROJECT_SOURCE_DIR}/mof/cim_base.mof ${talvex_mofs} PARENT_SCOPE)
+endfunction()
+
+# Sets <out> to the items as C string literals separated by commas: the
+# inside of an initializer list.
+function(tvx_c_strings out)
+  set(literals)
+  foreach(item IN LISTS ARGN)
+    string(REPLACE "\\" "\\\\" item "${item}")
+    string(REPLACE "\"" "\\\"" item "${item}")
+    list(APPEND literals "\"${item}\"")
+  endforeach()
+  list(JOIN literals "," joined)
+  set(${out} "${joined}" PARENT_SCOPE)
+endfunction()

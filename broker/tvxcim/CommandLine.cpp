@@ -7,7 +7,7 @@
 namespace tvxcim {
 
 const char *const usageText =
-    "usage: tvxcim [options] <command> [argument]\n"
+    "usage: tvxcim [options] <command> [argument] [options]\n"
     "commands:\n"
     "  ei CLASS     instances of a class (CLASS or namespace:CLASS)\n"
     "  ein CLASS    instance names of a class\n"
@@ -15,6 +15,7 @@ const char *const usageText =
     "  ai PATH      associated instances      ain PATH   associated names\n"
     "  ri PATH      association instances     rin PATH   association names\n"
     "  demo         every served class and association, then the first indications\n"
+    "  listen       every indication as it arrives, until --seconds or Ctrl-C\n"
     "options:\n"
     "  --provider-dir DIR    where provider libraries are found (repeatable)\n"
     "  --registration FILE   sfcb provider registration\n"
@@ -22,6 +23,7 @@ const char *const usageText =
     "  --properties A,B      property list (ei, gi, ai, ri); empty text: none\n"
     "  --assoc-class C  --result-class C  --role R  --result-role R\n"
     "  --seconds N           demo: wait at most N seconds for each first indication\n"
+    "                        (10 by default); listen: stop after N seconds\n"
     "  --json                JSON instead of MOF, one object per line (see below)\n"
     "  --help                this text\n"
     "JSON: an instance is {\"className\", \"path\", \"properties\"}, a path\n"
@@ -64,17 +66,19 @@ CommandLine helpOnly() {
 }  // namespace
 
 CommandLine parseCommandLine(const std::vector<std::string> &args) {
-    static const std::set<std::string> commands = {"ei", "ein", "gi",  "ai",  "ain",
-                                                   "ri", "rin", "demo"};
+    static const std::set<std::string> commands = {"ei", "ein", "gi",   "ai",    "ain",
+                                                   "ri", "rin", "demo", "listen"};
     CommandLine line;
+    std::vector<std::string> words;  // the command and its argument; options may come between
     std::size_t i = 0;
     auto value = [&](const std::string &option) -> std::string {
         if (i + 1 >= args.size()) throw UsageError(option + " needs a value");
         return args[++i];
     };
-    for (; i < args.size() && args[i].rfind("--", 0) == 0; ++i) {
+    for (; i < args.size(); ++i) {
         const std::string &option = args[i];
-        if (option == "--provider-dir") line.providerDirs.push_back(value(option));
+        if (option.rfind("--", 0) != 0) words.push_back(option);
+        else if (option == "--provider-dir") line.providerDirs.push_back(value(option));
         else if (option == "--registration") line.registration = value(option);
         else if (option == "--mof") line.mofFiles.push_back(value(option));
         else if (option == "--properties") line.properties = splitList(value(option));
@@ -87,15 +91,15 @@ CommandLine parseCommandLine(const std::vector<std::string> &args) {
         else if (option == "--help") return helpOnly();
         else throw UsageError("unknown option " + option);
     }
-    if (i >= args.size()) throw UsageError("no command given");
-    line.command = args[i++];
+    if (words.empty()) throw UsageError("no command given");
+    line.command = words.front();
     if (commands.count(line.command) == 0) throw UsageError("unknown command " + line.command);
-    const bool needsArgument = line.command != "demo";
-    if (needsArgument) {
-        if (i >= args.size()) throw UsageError(line.command + " needs an argument");
-        line.argument = args[i++];
+    const std::size_t wordsTaken = line.command == "demo" || line.command == "listen" ? 1 : 2;
+    if (wordsTaken == 2) {
+        if (words.size() < 2) throw UsageError(line.command + " needs an argument");
+        line.argument = words[1];
     }
-    if (i < args.size()) throw UsageError("unexpected argument " + args[i]);
+    if (words.size() > wordsTaken) throw UsageError("unexpected argument " + words[wordsTaken]);
     if (line.registration.empty()) throw UsageError("no provider registration: use --registration");
     if (line.mofFiles.empty()) throw UsageError("no class declarations: use --mof");
     if (line.providerDirs.empty()) throw UsageError("no provider directory: use --provider-dir");

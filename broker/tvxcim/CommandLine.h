@@ -2,6 +2,7 @@
 // argument.
 #pragma once
 
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -22,7 +23,9 @@ struct CommandLine {
     std::string resultClass;
     std::string role;
     std::string resultRole;
-    double seconds = 10;  // how long demo waits for each first indication
+    // How long demo waits for each first indication (10 s when not given),
+    // and how long listen listens (until interrupted when not given).
+    std::optional<double> seconds;
     bool json = false;
     bool help = false;  // nothing else is read then
     std::string command;

@@ -4,6 +4,7 @@
 
 #include "model/PathText.h"
 #include "tvxcim/Demo.h"
+#include "tvxcim/Listen.h"
 #include "tvxcim/StatusText.h"
 
 namespace tvxcim {
@@ -101,6 +102,8 @@ void runOnPath(Broker &broker, const CommandLine &line, ResultWriter &writer) {
 void runCommand(Broker &broker, const CommandLine &line, ResultWriter &writer) {
     if (line.command == "demo") {
         runDemo(broker, line, writer);
+    } else if (line.command == "listen") {
+        runListen(broker, line, writer);
     } else if (line.command == "ei" || line.command == "ein") {
         runOnClass(broker, line, writer);
     } else {

@@ -5,6 +5,8 @@
 #include <mutex>
 #include <set>
 
+#include "tvxcim/Subscription.h"
+
 namespace tvxcim {
 
 using tvxbroker::Broker;
@@ -15,6 +17,8 @@ using tvxbroker::Response;
 
 namespace {
 
+constexpr double kFirstIndicationSeconds = 10;
+
 ObjectPath classPath(const std::string &className) { return ObjectPath{"", defaultNameSpace, className, {}}; }
 
 // Waits for the first indication of the class, with the subscription made
@@ -24,26 +28,20 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
     std::mutex mutex;
     std::condition_variable arrived;
     std::optional<Instance> first;
-    const int subscription = broker.subscribe([&](const std::string &, const Instance &indication) {
-        std::lock_guard<std::mutex> lock(mutex);
+    const IndicationReceiver receiver(broker, [&](const std::string &, const Instance &indication) {
+        const std::lock_guard<std::mutex> lock(mutex);
         if (!first && tvxbroker::equalsIgnoreCase(indication.path.className, indicationClass)) {
             first = indication;
             arrived.notify_all();
         }
         return true;
     });
-    const std::string query = "SELECT * FROM " + indicationClass;
-    Response response = broker.activateFilter(defaultNameSpace, indicationClass, query, true);
-    if (response.ok()) response = broker.enableIndications(defaultNameSpace, indicationClass);
-    if (response.ok()) {
-        std::unique_lock<std::mutex> lock(mutex);
+    const ClassSubscription subscription(broker, indicationClass);
+    std::unique_lock<std::mutex> lock(mutex);
+    if (subscription.response().ok()) {
         arrived.wait_for(lock, std::chrono::duration<double>(seconds), [&] { return first.has_value(); });
     }
-    // Once unsubscribed, nothing writes `first` any more.
-    broker.unsubscribe(subscription);
-    writer.firstIndication(indicationClass, response, first, seconds);
-    broker.disableIndications(defaultNameSpace, indicationClass);
-    broker.deActivateFilter(defaultNameSpace, indicationClass, query, true);
+    writer.firstIndication(indicationClass, subscription.response(), first, seconds);
 }
 
 }  // namespace
@@ -67,7 +65,8 @@ void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
     shown.clear();
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.indication && shown.insert(registration.className).second) {
-            showFirstIndication(broker, registration.className, line.seconds, writer);
+            showFirstIndication(broker, registration.className, line.seconds.value_or(kFirstIndicationSeconds),
+                                writer);
         }
     }
 }

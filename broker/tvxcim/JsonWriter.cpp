@@ -36,6 +36,8 @@ public:
 
     void path(const ObjectPath &path) override { write(pathJson(path)); }
 
+    void flush() override { out.flush(); }
+
     void enumeration(const std::string &className, const Response &response) override {
         Json json = section("ei");
         json["className"] = className;

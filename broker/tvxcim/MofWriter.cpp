@@ -23,6 +23,8 @@ public:
 
     void path(const ObjectPath &path) override { out << tvxbroker::formatPath(path) << '\n'; }
 
+    void flush() override { out.flush(); }
+
     void enumeration(const std::string &className, const Response &response) override {
         out << "== ei " << className << "\n";
         if (!failure(response)) {

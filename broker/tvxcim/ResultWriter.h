@@ -19,6 +19,8 @@ public:
 
     virtual void instance(const tvxbroker::Instance &instance) = 0;
     virtual void path(const tvxbroker::ObjectPath &path) = 0;
+    // Hands what has been written on, for output read as it comes.
+    virtual void flush() = 0;
 
     // The demo's sections. `response` may have failed.
     virtual void enumeration(const std::string &className, const tvxbroker::Response &response) = 0;

@@ -1,20 +1,18 @@
 // A broker loaded with the test providers, and the helpers that keep the
-// tests about behaviour: building paths, comparing answers as a client
-// would, and waiting for delivered events.
+// tests about behaviour: building paths and comparing answers as a client
+// would.
 #pragma once
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <chrono>
-#include <condition_variable>
 #include <cstddef>
 #include <cstdint>
-#include <mutex>
 #include <string>
 #include <vector>
 
+#include "EventSink.h"
 #include "core/Broker.h"
 #include "model/PathText.h"
 
@@ -23,9 +21,6 @@ namespace brokertest {
 using namespace tvxbroker;
 
 inline constexpr const char *kNs = "root/cimv2";
-
-// Only reached when something is wrong; a healthy run waits a period or two.
-inline constexpr std::chrono::milliseconds kPatience{30000};
 
 inline ObjectPath classPath(const std::string &cls) { return ObjectPath{"", kNs, cls, {}}; }
 
@@ -65,42 +60,6 @@ inline std::uint64_t unsignedOf(const Instance &inst, const char *property) {
     EXPECT_NE(value, nullptr) << property;
     return value == nullptr ? 0 : value->unsignedValue;
 }
-
-struct Delivery {
-    std::string nameSpace;
-    Instance event;
-};
-
-// Records delivered events, so that a test can wait for them with a deadline.
-class EventSink {
-public:
-    IndicationSubscriber subscriber(bool accept) {
-        return [this, accept](const std::string &nameSpace, const Instance &event) {
-            {
-                const std::lock_guard<std::mutex> lock(mutex);
-                deliveries.push_back({nameSpace, event});
-            }
-            arrived.notify_all();
-            return accept;
-        };
-    }
-
-    // False when `patience` runs out before `count` events have arrived.
-    bool waitFor(std::size_t count, std::chrono::milliseconds patience = kPatience) {
-        std::unique_lock<std::mutex> lock(mutex);
-        return arrived.wait_for(lock, patience, [&] { return deliveries.size() >= count; });
-    }
-
-    std::vector<Delivery> received() const {
-        const std::lock_guard<std::mutex> lock(mutex);
-        return deliveries;
-    }
-
-private:
-    mutable std::mutex mutex;
-    std::condition_variable arrived;
-    std::vector<Delivery> deliveries;
-};
 
 class BrokerTest : public testing::Test {
 protected:

@@ -1,5 +1,7 @@
 # Runs `tvxcim demo` on the built-in host as a user would and checks that
-# what it shows is the default host's ports, identities and associations.
+# what it shows is the default host's ports, identities and associations,
+# and at the end this host's first heartbeat.
+cmake_host_system_information(RESULT host QUERY HOSTNAME)
 execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
                 RESULT_VARIABLE status OUTPUT_VARIABLE shown ERROR_VARIABLE errors)
 if(NOT status EQUAL 0)
@@ -18,3 +20,8 @@ foreach(pattern IN LISTS expected)
     message(FATAL_ERROR "tvxcim demo did not show '${pattern}':\n${shown}")
   endif()
 endforeach()
+# One pattern, whose semicolons a list would split.
+set(heartbeat "== first indication of Talvex_CIMHeartbeat\n// root/cimv2:Talvex_CIMHeartbeat\ninstance of Talvex_CIMHeartbeat\n{\n    hostname = \"${host}\";\n    stamp = 0;\n    IndicationTime = \"[0-9]+\\.000000\\+000\";\n};\n\n$")
+if(NOT shown MATCHES "${heartbeat}")
+  message(FATAL_ERROR "tvxcim demo did not end with the first heartbeat of ${host}:\n${shown}")
+endif()

@@ -12,9 +12,9 @@
 namespace ethernettest {
 
 void EthernetBroker::SetUp() {
-    BrokerConfig config = loadBrokerConfig(
-        {TVX_PROVIDER_DIR}, TVX_PROVIDER_REG,
-        {TVX_MOF_DIR "/cim_base.mof", TVX_MOF_DIR "/talvex_ethernet.mof", TVX_TEST_MOF});
+    std::vector<std::string> mofs = {TVX_PRODUCT_MOFS};
+    mofs.push_back(TVX_TEST_MOF);
+    BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, mofs);
     for (const ProviderRegistration &registration : std::vector<ProviderRegistration>(config.registrations)) {
         if (registration.className != "Talvex_EthernetPort") continue;
         ProviderRegistration unserved = registration;

@@ -97,6 +97,11 @@ INSTANTIATE_TEST_SUITE_P(
         ErrorCase{"UnknownOption", onTestProviders({"--jsn", "ei", "Test_Widget"}), 2,
                   "unknown option --jsn" + kUsageHint},
         ErrorCase{"MissingArgument", onTestProviders({"gi"}), 2, "gi needs an argument" + kUsageHint},
+        ErrorCase{"ListenForAClass", onTestProviders({"listen", "Test_Event"}), 2,
+                  "unexpected argument Test_Event" + kUsageHint},
+        ErrorCase{"ListenWithoutIndicationClasses",
+                  withFiles(TVX_TESTPROVIDER_DIR, TVX_OMCTESTPROVIDER_REG, TVX_OMCTESTPROVIDER_MOF, {"listen"}), 1,
+                  "the registration serves no indication class"},
         ErrorCase{"NoRegistration", Args{"--provider-dir", "/tmp", "ei", "Test_Widget"}, 2,
                   "no provider registration: use --registration" + kUsageHint}),
     [](const auto &test) { return std::string(test.param.name); });

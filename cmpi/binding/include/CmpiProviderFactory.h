@@ -6,13 +6,15 @@
 // Every factory call: wraps the context; points its interface object at its
 // table; creates, attaches and initializes the provider when the base object
 // has none yet (initialize's status is not looked at, so a provider whose
-// initialization failed is still served); records it in the base object;
+// initialization failed is still served, but one whose initialize throws is
+// deleted and the exception goes on); records it in the base object;
 // instance factories then write one line to standard error; finally the
 // interface's handle is set to the provider, the use count is raised and the
 // interface is returned.
 #pragma once
 
 #include <cstdio>
+#include <memory>
 #include <typeinfo>
 
 #include "CmpiAssociationMI.h"
@@ -27,21 +29,22 @@
 
 // The steps every factory shares; `announce` runs between recording the
 // provider and handing it out.
-#define CMPI_FACTORY_BODY(cn, pn, MIType, table, announce)     \
-    static MIType mi;                                          \
-    CmpiContext context(ctx);                                  \
-    mi.ft = &table;                                            \
-    CmpiBaseMI *provider = base##pn.getBaseMI();               \
-    if (provider == nullptr) {                                 \
-        CmpiBroker wrappedBroker(broker);                      \
-        provider = new cn(wrappedBroker, context);             \
-        provider->setProviderBase(&base##pn);                  \
-        provider->initialize(context);                         \
-        base##pn.setBaseMI(provider);                          \
-    }                                                          \
-    announce;                                                  \
-    mi.hdl = provider;                                         \
-    base##pn.incUseCount();                                    \
+#define CMPI_FACTORY_BODY(cn, pn, MIType, table, announce)                   \
+    static MIType mi;                                                        \
+    CmpiContext context(ctx);                                                \
+    mi.ft = &table;                                                          \
+    CmpiBaseMI *provider = base##pn.getBaseMI();                             \
+    if (provider == nullptr) {                                               \
+        CmpiBroker wrappedBroker(broker);                                    \
+        std::unique_ptr<CmpiBaseMI> created(new cn(wrappedBroker, context)); \
+        created->setProviderBase(&base##pn);                                 \
+        created->initialize(context);                                        \
+        provider = created.release();                                        \
+        base##pn.setBaseMI(provider);                                        \
+    }                                                                        \
+    announce;                                                                \
+    mi.hdl = provider;                                                       \
+    base##pn.incUseCount();                                                  \
     return &mi;
 
 #define CMInstanceMIFactory(cn, pn)                                                          \

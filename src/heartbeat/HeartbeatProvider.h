@@ -1,0 +1,37 @@
+// The indication provider of Talvex_CIMHeartbeat. Its thread sends whether
+// or not the broker has enabled indications, and the broker decides who
+// receives them, so every indication operation accepts and changes nothing.
+#pragma once
+
+#include "CmpiIndicationMI.h"
+
+namespace Heartbeat {
+
+class HeartbeatProvider : public CmpiIndicationMI {
+public:
+    HeartbeatProvider(const CmpiBroker &mb, const CmpiContext &ctx);
+    ~HeartbeatProvider() override;
+
+    CmpiStatus authorizeFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
+                               const char *className, const CmpiObjectPath &op,
+                               const char *owner) override;
+    CmpiStatus mustPoll(const CmpiContext &ctx, const CmpiSelectExp &filter, const char *className,
+                        const CmpiObjectPath &op) override;
+    CmpiStatus activateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
+                              const char *className, const CmpiObjectPath &op,
+                              bool firstActivation) override;
+    CmpiStatus deActivateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
+                                const char *className, const CmpiObjectPath &op,
+                                bool lastActivation) override;
+    CmpiStatus enableIndications(const CmpiContext &ctx) override;
+    CmpiStatus disableIndications(const CmpiContext &ctx) override;
+
+    // Reads the period and starts the thread, unless it runs or has been
+    // stopped; throws CMPI_RC_ERR_FAILED when it cannot be created.
+    CmpiStatus initialize(const CmpiContext &ctx) override;
+    // Refused with CMPI_RC_NEVER_UNLOAD unless terminating; terminating, it
+    // stops the thread for the rest of the process.
+    CmpiStatus cleanup(const CmpiContext &ctx, bool terminating) override;
+};
+
+}  // namespace Heartbeat
