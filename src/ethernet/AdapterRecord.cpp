@@ -4,9 +4,12 @@
 #include <cstring>
 
 #include "frame/BoundedText.h"
+#include "frame/LittleEndian.h"
 
 namespace EthernetProvider {
 namespace {
+
+using frame::littleEndian;
 
 constexpr std::size_t driverNameAt = 0;
 constexpr std::size_t driverVersionAt = 32;
@@ -25,13 +28,6 @@ constexpr std::size_t speedAt = 190;
 constexpr std::size_t fullDuplexAt = 192;
 constexpr std::size_t macTextAt = 1225;
 constexpr std::size_t macTextWidth = adapterRecordSize - macTextAt;
-
-// The record is little-endian whatever the host.
-uint32_t littleEndian(const unsigned char *bytes, std::size_t width) {
-    uint32_t value = 0;
-    for (std::size_t i = width; i-- > 0;) value = (value << 8) | bytes[i];
-    return value;
-}
 
 const char *textAt(const unsigned char (&record)[adapterRecordSize], std::size_t offset) {
     return reinterpret_cast<const char *>(record + offset);

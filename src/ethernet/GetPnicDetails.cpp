@@ -5,6 +5,7 @@
 #include "ethernet/AdapterRecord.h"
 #include "ethernet/LinkSettings.h"
 #include "frame/BoundedText.h"
+#include "frame/LittleEndian.h"
 #include "platform/ParamList.h"
 
 namespace EthernetProvider {
@@ -14,11 +15,6 @@ constexpr int adapterListNode = 70;
 constexpr int adapterRecordNode = 72;
 constexpr int adapterMtuNode = 74;
 constexpr unsigned int failed = 1;
-
-uint32_t littleEndian32(const unsigned char (&bytes)[4]) {
-    return uint32_t(bytes[0]) | uint32_t(bytes[1]) << 8 | uint32_t(bytes[2]) << 16 |
-           uint32_t(bytes[3]) << 24;
-}
 
 enum class Step { added, stop, fail };
 
@@ -40,7 +36,7 @@ Step readAdapter(PRB_ParamList *adapters, int index, std::vector<PnicDetails> &p
     PnicDetails details;
     std::memset(&details, 0, sizeof details);
     frame::copyBounded(details.name, name);
-    details.mtu = littleEndian32(mtu);
+    details.mtu = frame::littleEndian(mtu, sizeof mtu);
     queryLinkSettings(name, details);
     decodeAdapterRecord(record, details);
     pnics.push_back(details);

@@ -1,6 +1,6 @@
 # Runs `tvxcim demo` on the built-in host as a user would and checks that
 # what it shows is the default host's ports, identities and associations,
-# and at the end this host's first heartbeat.
+# its two processor packages, and at the end this host's first heartbeat.
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
 execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
                 RESULT_VARIABLE status OUTPUT_VARIABLE shown ERROR_VARIABLE errors)
@@ -14,6 +14,8 @@ set(expected
   "VersionString = \"tg3 device firmware FFV7.10.18 bc 5720-v1.39\";"
   "instance of Talvex_EPDriverElementSoftwareIdentity"
   "instance of Talvex_EPFirmwareElementSoftwareIdentity"
+  "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-0\";[^}]*Vendor = 2;"
+  "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-1\";[^}]*Vendor = 3;"
   "== ain root/cimv2:Talvex_EthernetPort.DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity")
 foreach(pattern IN LISTS expected)
   if(NOT shown MATCHES "${pattern}")

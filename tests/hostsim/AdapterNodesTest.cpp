@@ -1,15 +1,7 @@
-#include <cstring>
-
 #include "HostSimTesting.h"
 
 namespace hostsim_test {
 namespace {
-
-Bytes textField(const std::string &text, std::size_t width) {
-    Bytes bytes(width, 0);
-    std::memcpy(bytes.data(), text.data(), std::min(width, text.size()));
-    return bytes;
-}
 
 class HostSimAdapterNodes : public HostSimTest {};
 
@@ -19,7 +11,7 @@ TEST_F(HostSimAdapterNodes, RecordCarriesEveryFieldAtItsOffsetAndZeroElsewhere) 
                  {"enabledCapabilities", "0x55667788"}, {"pciBus", 0x01020304}, {"pciSlot", "0x0A0B0C0D"},
                  {"pciFunction", 7}, {"pciVendorId", "0x8086"}, {"pciDeviceId", 0x10fb}, {"linkUp", 2},
                  {"speedMbps", 10000}, {"fullDuplex", true}, {"mac", "02:11:22:aa:bb:cc"}}}));
-    const std::pair<std::size_t, Bytes> fields[] = {
+    const Fields fields = {
         {0, textField("ixgbe", 32)},    {32, textField("3.7.13", 32)},   {64, textField("0x800004d8", 32)},
         {128, textField("vmnic0", 32)}, {160, {0x44, 0x33, 0x22, 0x11}}, {164, {0x88, 0x77, 0x66, 0x55}},
         {172, {4, 3, 2, 1}},            {176, {0x0d, 0x0c, 0x0b, 0x0a}}, {180, {7, 0, 0, 0}},
@@ -28,14 +20,7 @@ TEST_F(HostSimAdapterNodes, RecordCarriesEveryFieldAtItsOffsetAndZeroElsewhere) 
     };
     Bytes record(1252, 0xa5);
     ASSERT_EQ(readNode(72, {"probe"}, record), HOSTSIM_STATUS_OK);
-    std::vector<bool> inField(record.size(), false);
-    for (const auto &[offset, bytes] : fields) {
-        EXPECT_EQ(Bytes(record.begin() + offset, record.begin() + offset + bytes.size()), bytes) << offset;
-        std::fill_n(inField.begin() + offset, bytes.size(), true);
-    }
-    for (std::size_t i = 0; i < record.size(); ++i) {
-        EXPECT_TRUE(inField[i] || record[i] == 0) << "byte " << i << " belongs to no field";
-    }
+    expectFieldsElseZero(record, fields);
 }
 
 TEST_F(HostSimAdapterNodes, LongTextsFillTheirFieldWithoutTerminator) {
@@ -70,7 +55,7 @@ TEST_F(HostSimAdapterNodes, InstancesInProfileOrderWithTheirMtu) {
 }
 
 TEST_F(HostSimAdapterNodes, BadRequestsFailAndLeaveTheBufferAlone) {
-    const std::tuple<const char *, int, std::vector<std::string>, std::size_t, int> cases[] = {
+    const std::tuple<const char *, int, std::vector<Param>, std::size_t, int> cases[] = {
         {"record one byte short", 72, {"vmnic0"}, 1251, HOSTSIM_STATUS_BAD_SIZE},
         {"MTU into 8 bytes", 74, {"vmnic0"}, 8, HOSTSIM_STATUS_BAD_SIZE},
         {"unknown node", 71, {"vmnic0"}, 4, HOSTSIM_STATUS_UNKNOWN_NODE},

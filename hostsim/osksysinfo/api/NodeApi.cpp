@@ -45,8 +45,8 @@ int PRB_GetInstanceListAlloc(int node, PRB_ParamList *parent, PRB_ParamList **li
     const NodeDefinition *definition = findNode(node);
     if (definition == nullptr || definition->listInstances == nullptr) return HOSTSIM_STATUS_UNKNOWN_NODE;
     auto instances = std::make_unique<PRB_ParamList>();
-    const int status = definition->listInstances(*consulted.profile, parent, *instances);
-    if (status == HOSTSIM_STATUS_OK) *list = ListRegistry::instance().handOut(std::move(instances));
+    const int status = definition->listInstances(*consulted.profile, parent, instances);
+    if (status == HOSTSIM_STATUS_OK && instances) *list = ListRegistry::instance().handOut(std::move(instances));
     return status;
 }
 

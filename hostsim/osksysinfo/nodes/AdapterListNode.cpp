@@ -7,9 +7,10 @@ namespace hostsim {
 
 namespace {
 
-int listAdapters(const HostProfile &profile, const PRB_ParamList *parent, PRB_ParamList &out) {
+int listAdapters(const HostProfile &profile, const PRB_ParamList *parent,
+                 std::unique_ptr<PRB_ParamList> &out) {
     if (!hasNoParams(parent)) return HOSTSIM_STATUS_BAD_ARGUMENT;
-    for (const AdapterProfile &adapter : profile.adapters) out.entries.push_back(PRB_Param{adapter.name});
+    for (const AdapterProfile &adapter : profile.adapters) out->entries.push_back(PRB_Param{adapter.name});
     return HOSTSIM_STATUS_OK;
 }
 

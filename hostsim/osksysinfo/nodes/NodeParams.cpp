@@ -6,11 +6,6 @@ bool hasNoParams(const PRB_ParamList *list) {
     return list == nullptr || list->entries.empty();
 }
 
-const std::string *soleTextParam(const PRB_ParamList *list) {
-    if (list == nullptr || list->entries.size() != 1) return nullptr;
-    return std::get_if<std::string>(&list->entries.front().value);
-}
-
 std::optional<std::string> lastParamText(const PRB_ParamList *list) {
     if (hasNoParams(list)) return std::nullopt;
     const auto &last = list->entries.back().value;

@@ -3,15 +3,31 @@
 
 #include <optional>
 #include <string>
+#include <variant>
 
+#include "hostsim/HostSimControl.h"
 #include "serving/ParamList.h"
 
 namespace hostsim {
 
 bool hasNoParams(const PRB_ParamList *list);
 
-// The list's only parameter when it is a text; null otherwise.
-const std::string *soleTextParam(const PRB_ParamList *list);
+// A read of a host-wide node, which takes no parameters: `encode` writes the
+// record.
+template <typename Encode>
+int readWithoutParams(const PRB_ParamList *params, Encode encode) {
+    if (!hasNoParams(params)) return HOSTSIM_STATUS_BAD_ARGUMENT;
+    encode();
+    return HOSTSIM_STATUS_OK;
+}
+
+// The list's only parameter when it is a `Value` (a text or an integer);
+// null otherwise.
+template <typename Value>
+const Value *soleParam(const PRB_ParamList *list) {
+    if (list == nullptr || list->entries.size() != 1) return nullptr;
+    return std::get_if<Value>(&list->entries.front().value);
+}
 
 // The last parameter as text, integers in decimal: the instance a call is
 // about. Nothing for an absent or empty list.

@@ -4,15 +4,18 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 
 #include "profile/HostProfile.h"
 #include "serving/ParamList.h"
 
 namespace hostsim {
 
-// Both return a HostSimStatus. `out` is empty and `record` is recordSize
-// zeroed bytes; what they leave there reaches the caller only on success.
-using ListInstances = int (*)(const HostProfile &profile, const PRB_ParamList *parent, PRB_ParamList &out);
+// Both return a HostSimStatus. `out` is an empty list and `record` is
+// recordSize zeroed bytes; what they leave there reaches the caller only on
+// success. A node resets `out` to succeed without handing out a list.
+using ListInstances = int (*)(const HostProfile &profile, const PRB_ParamList *parent,
+                              std::unique_ptr<PRB_ParamList> &out);
 using ReadRecord = int (*)(const HostProfile &profile, const PRB_ParamList *params, unsigned char *record);
 
 struct NodeDefinition {

@@ -1,9 +1,9 @@
 // "adapters": the physical network adapters, in instance-list order. An entry
 // with "count" N stands for N adapters named <name>0 ... <name>N-1, so a
 // large host is a few lines of JSON.
-#include <limits>
 #include <string>
 
+#include "profile/FieldReading.h"
 #include "profile/ProfileError.h"
 #include "profile/ProfileSections.h"
 
@@ -12,17 +12,6 @@ namespace hostsim {
 namespace {
 
 constexpr std::uint64_t mostAdapters = 100000;
-constexpr std::uint64_t max16 = std::numeric_limits<std::uint16_t>::max();
-constexpr std::uint64_t max32 = std::numeric_limits<std::uint32_t>::max();
-
-template <typename Number>
-void readNumber(JsonObjectReader &entry, const char *key, std::uint64_t max, Number &into) {
-    if (const auto value = entry.unsignedInteger(key, 0, max)) into = static_cast<Number>(*value);
-}
-
-void readText(JsonObjectReader &entry, const char *key, std::string &into) {
-    if (auto value = entry.text(key)) into = std::move(*value);
-}
 
 AdapterProfile readAdapter(JsonObjectReader &entry) {
     AdapterProfile adapter;
@@ -33,18 +22,18 @@ AdapterProfile readAdapter(JsonObjectReader &entry) {
     readText(entry, "driverVersion", adapter.driverVersion);
     readText(entry, "firmwareVersion", adapter.firmwareVersion);
     readText(entry, "interfaceName", adapter.interfaceName);
-    readNumber(entry, "capabilities", max32, adapter.capabilities);
-    readNumber(entry, "enabledCapabilities", max32, adapter.enabledCapabilities);
-    readNumber(entry, "pciBus", max32, adapter.pciBus);
-    readNumber(entry, "pciSlot", max32, adapter.pciSlot);
-    readNumber(entry, "pciFunction", max32, adapter.pciFunction);
-    readNumber(entry, "pciVendorId", max16, adapter.pciVendorId);
-    readNumber(entry, "pciDeviceId", max16, adapter.pciDeviceId);
-    adapter.linkUp = entry.flag("linkUp").value_or(adapter.linkUp);
-    readNumber(entry, "speedMbps", max16, adapter.speedMbps);
-    adapter.fullDuplex = entry.flag("fullDuplex").value_or(adapter.fullDuplex);
+    readNumber(entry, "capabilities", adapter.capabilities);
+    readNumber(entry, "enabledCapabilities", adapter.enabledCapabilities);
+    readNumber(entry, "pciBus", adapter.pciBus);
+    readNumber(entry, "pciSlot", adapter.pciSlot);
+    readNumber(entry, "pciFunction", adapter.pciFunction);
+    readNumber(entry, "pciVendorId", adapter.pciVendorId);
+    readNumber(entry, "pciDeviceId", adapter.pciDeviceId);
+    readFlag(entry, "linkUp", adapter.linkUp);
+    readNumber(entry, "speedMbps", adapter.speedMbps);
+    readFlag(entry, "fullDuplex", adapter.fullDuplex);
     readText(entry, "mac", adapter.mac);
-    readNumber(entry, "mtu", max32, adapter.mtu);
+    readNumber(entry, "mtu", adapter.mtu);
     return adapter;
 }
 

@@ -8,6 +8,7 @@
 
 #include "profile/AdapterProfile.h"
 #include "profile/FaultRule.h"
+#include "profile/ProcessorProfile.h"
 
 namespace hostsim {
 
@@ -16,6 +17,7 @@ struct HostProfile {
     bool serviceConsole = false;  // a "Corla" host; a "Corlai" host has none
     std::vector<AdapterProfile> adapters;  // in instance-list order
     std::unordered_map<std::string, std::size_t> adapterIndex;  // name -> position in adapters
+    ProcessorProfile processors;
     std::vector<FaultRule> faults;
 
     const AdapterProfile *findAdapter(const std::string &name) const {

@@ -31,6 +31,18 @@ std::optional<std::uint64_t> parseHex(const std::string &text) {
     return value;
 }
 
+// A JSON integer of zero or more, or hexadecimal text.
+std::optional<std::uint64_t> unsignedValue(const nlohmann::json &value) {
+    if (value.is_number_unsigned()) return value.get<std::uint64_t>();
+    if (value.is_string()) return parseHex(value.get<std::string>());
+    return std::nullopt;
+}
+
+std::string rangeProblem(const std::string &min, const std::string &max, const nlohmann::json &value) {
+    return "an integer from " + min + " to " + max + " (or hexadecimal text such as \"0x1f\"), got " +
+           describe(value);
+}
+
 }  // namespace
 
 JsonObjectReader::JsonObjectReader(const nlohmann::json &object, std::string path)
@@ -75,24 +87,27 @@ std::optional<std::uint64_t> JsonObjectReader::unsignedInteger(const char *key, 
                                                                std::uint64_t max) {
     const nlohmann::json *value = field(key);
     if (!value) return std::nullopt;
-    std::optional<std::uint64_t> number;
-    if (value->is_number_unsigned()) number = value->get<std::uint64_t>();
-    if (value->is_string()) number = parseHex(value->get<std::string>());
+    const std::optional<std::uint64_t> number = unsignedValue(*value);
     if (!number || *number < min || *number > max) {
-        fail(key, "expected an integer from " + std::to_string(min) + " to " + std::to_string(max) +
-                      " (or hexadecimal text such as \"0x1f\"), got " + describe(*value));
+        fail(key, "expected " + rangeProblem(std::to_string(min), std::to_string(max), *value));
     }
     return number;
 }
 
-std::optional<std::int64_t> JsonObjectReader::signedInteger(const char *key) {
+std::optional<std::int64_t> JsonObjectReader::signedInteger(const char *key, std::int64_t min, std::int64_t max) {
     const nlohmann::json *value = field(key);
     if (!value) return std::nullopt;
-    const bool fits = value->is_number_integer() &&
-                      (!value->is_number_unsigned() ||
-                       value->get<std::uint64_t>() <= std::uint64_t(std::numeric_limits<std::int64_t>::max()));
-    if (!fits) fail(key, "expected a 64-bit signed integer, got " + describe(*value));
-    return value->get<std::int64_t>();
+    std::optional<std::int64_t> number;
+    const std::optional<std::uint64_t> unsignedNumber = unsignedValue(*value);
+    if (value->is_number_integer() && !value->is_number_unsigned()) {
+        number = value->get<std::int64_t>();
+    } else if (unsignedNumber && *unsignedNumber <= std::uint64_t(std::numeric_limits<std::int64_t>::max())) {
+        number = std::int64_t(*unsignedNumber);
+    }
+    if (!number || *number < min || *number > max) {
+        fail(key, "expected " + rangeProblem(std::to_string(min), std::to_string(max), *value));
+    }
+    return number;
 }
 
 std::optional<bool> JsonObjectReader::boolean(const char *key) {
@@ -102,14 +117,28 @@ std::optional<bool> JsonObjectReader::boolean(const char *key) {
     return value->get<bool>();
 }
 
-std::optional<std::uint8_t> JsonObjectReader::flag(const char *key) {
+std::optional<std::uint64_t> JsonObjectReader::flag(const char *key, std::uint64_t max) {
     const nlohmann::json *value = field(key);
     if (!value) return std::nullopt;
-    if (value->is_boolean()) return std::uint8_t(value->get<bool>() ? 1 : 0);
-    if (value->is_number_unsigned() && value->get<std::uint64_t>() <= 255) {
-        return static_cast<std::uint8_t>(value->get<std::uint64_t>());
+    if (value->is_boolean()) return value->get<bool>() ? 1 : 0;
+    const std::optional<std::uint64_t> number = unsignedValue(*value);
+    if (!number || *number > max) {
+        fail(key, "expected true, false or " + rangeProblem("0", std::to_string(max), *value));
     }
-    fail(key, "expected true, false or an integer from 0 to 255, got " + describe(*value));
+    return number;
+}
+
+bool JsonObjectReader::isNull(const char *key) {
+    const nlohmann::json *value = field(key);
+    return value != nullptr && value->is_null();
+}
+
+bool JsonObjectReader::object(const char *key, const std::function<void(JsonObjectReader &object)> &read) {
+    const nlohmann::json *value = field(key);
+    if (!value) return false;
+    JsonObjectReader reader(*value, fieldPath(key));
+    read(reader);
+    return true;
 }
 
 void JsonObjectReader::eachObject(const char *key, const std::function<void(JsonObjectReader &element)> &read) {

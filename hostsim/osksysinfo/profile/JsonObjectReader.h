@@ -5,6 +5,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <limits>
 #include <optional>
 #include <set>
 #include <string>
@@ -25,10 +26,17 @@ public:
     std::optional<std::string> textOrInteger(const char *key);
     // An integer, or hexadecimal text such as "0x8086".
     std::optional<std::uint64_t> unsignedInteger(const char *key, std::uint64_t min, std::uint64_t max);
-    std::optional<std::int64_t> signedInteger(const char *key);
+    std::optional<std::int64_t> signedInteger(const char *key,
+                                              std::int64_t min = std::numeric_limits<std::int64_t>::min(),
+                                              std::int64_t max = std::numeric_limits<std::int64_t>::max());
     std::optional<bool> boolean(const char *key);
-    // true, false, or a byte value 0 to 255 (false is 0, true is 1).
-    std::optional<std::uint8_t> flag(const char *key);
+    // true, false, or a value from 0 to `max` (false is 0, true is 1).
+    std::optional<std::uint64_t> flag(const char *key, std::uint64_t max = 255);
+    // True when the field is present and JSON null.
+    bool isNull(const char *key);
+    // Reads the object `key` (absent: not at all, and returns false) with
+    // the path "key".
+    bool object(const char *key, const std::function<void(JsonObjectReader &object)> &read);
     // Reads each element of the array `key` (absent: none) as an object
     // whose path is "key[i]".
     void eachObject(const char *key, const std::function<void(JsonObjectReader &element)> &read);

@@ -37,6 +37,7 @@ HostProfile parseProfile(const std::string &json) {
     profile.hostName = host.text("hostName").value_or(profile.hostName);
     profile.serviceConsole = readServiceConsole(host);
     readAdapters(host, profile);
+    readProcessors(host, profile);
     readFaults(host, profile);
     host.finish();
     return profile;

@@ -1,0 +1,107 @@
+// One enumInstances through the embedded broker, per class, on the default
+// host and on a large one; prints the time per request and per instance,
+// and how many times longer the large host takes.
+#include <benchmark/benchmark.h>
+
+#include <cstdio>
+#include <map>
+#include <string>
+
+#include "core/Broker.h"
+#include "hostsim/HostSimControl.h"
+
+namespace {
+
+using namespace tvxbroker;
+
+std::map<std::string, double> nanosPerRequest;
+
+void enumerate(benchmark::State &state, const char *className, const char *profileFile) {
+    char error[512];
+    if (profileFile == nullptr) {
+        HostSim_ResetProfile();
+    } else if (HostSim_LoadProfileFile(profileFile, error, sizeof error) != 0) {
+        state.SkipWithError(error);
+        return;
+    }
+    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PRODUCT_REGISTRATION, {TVX_PRODUCT_MOFS}));
+    const ObjectPath classPath{"", "root/cimv2", className, {}};
+    std::size_t instances = 0;
+    for (auto _ : state) {
+        const Response response = broker.enumInstances(classPath, std::nullopt);
+        if (!response.ok()) {
+            state.SkipWithError("enumInstances failed");
+            break;
+        }
+        instances = response.instances.size();
+    }
+    state.counters["instances"] = double(instances);
+    state.counters["per_instance"] = benchmark::Counter(
+        double(instances) * double(state.iterations()),
+        benchmark::Counter::kIsRate | benchmark::Counter::kInvert);
+    broker.shutdown();
+}
+
+struct HostPair {
+    const char *what;
+    const char *small;
+    const char *large;
+};
+
+const HostPair pairs[] = {
+    {"1,000 adapters against the default host's 2", "enumerate/ports_defaultHost",
+     "enumerate/ports_1000Adapters"},
+    {"64 packages of 32 cores against the default host's 2 of 4",
+     "enumerate/processors_defaultHost", "enumerate/processors_64Packages"},
+};
+
+BENCHMARK_CAPTURE(enumerate, ports_defaultHost, "Talvex_EthernetPort", nullptr)
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(enumerate, ports_1000Adapters, "Talvex_EthernetPort",
+                  TVX_PROFILE_DIR "/adapters-1000.json")
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(enumerate, processors_defaultHost, "Talvex_Processor", nullptr)
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(enumerate, processors_64Packages, "Talvex_Processor",
+                  TVX_PROFILE_DIR "/processors-many.json")
+    ->Unit(benchmark::kMillisecond);
+
+class RatioReporter : public benchmark::ConsoleReporter {
+public:
+    RatioReporter() : ConsoleReporter(OO_Tabular) {}
+
+    void ReportRuns(const std::vector<Run> &runs) override {
+        for (const Run &run : runs) {
+            if (run.iterations > 0) nanosPerRequest[run.benchmark_name()] = run.GetAdjustedRealTime() *
+                                                                           unitNanos(run.time_unit);
+        }
+        ConsoleReporter::ReportRuns(runs);
+    }
+
+private:
+    static double unitNanos(benchmark::TimeUnit unit) {
+        switch (unit) {
+            case benchmark::kMicrosecond: return 1e3;
+            case benchmark::kMillisecond: return 1e6;
+            case benchmark::kSecond: return 1e9;
+            default: return 1;
+        }
+    }
+};
+
+}  // namespace
+
+int main(int argc, char **argv) {
+    benchmark::Initialize(&argc, argv);
+    RatioReporter reporter;
+    benchmark::RunSpecifiedBenchmarks(&reporter);
+    benchmark::Shutdown();
+    for (const HostPair &pair : pairs) {
+        const auto small = nanosPerRequest.find(pair.small);
+        const auto large = nanosPerRequest.find(pair.large);
+        if (small != nanosPerRequest.end() && large != nanosPerRequest.end()) {
+            std::printf("%s: %.0f times as long\n", pair.what, large->second / small->second);
+        }
+    }
+    return 0;
+}

@@ -1,0 +1,151 @@
+// The package walk against the stand-in host: which core supplies each
+// package's CPUID data, where the core-state walk stops, the two ways a host
+// can have no packages, and every failing call giving 1 with no list left.
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "hostsim/HostSimControl.h"
+#include "processor/GetProcessorDetails.h"
+
+namespace Processor {
+namespace {
+
+const char *const intel = R"({"vendor": "GenuineIntel", "stepping": 1, "leaf1Ebx": "0x0a",
+                             "leaf1Ecx": "0x20", "extendedEdx": "0x20100000"})";
+const char *const amd = R"({"vendor": "AuthenticAMD", "stepping": 2, "leaf1Ebx": "0x0b"})";
+
+std::string host(const std::string &packages, const std::string &faults = "") {
+    return R"({"hostType": "Corlai", "processors": {"hardwareThreads": true,
+        "modelText": "Xeon\tE5", "powerPolicy": "Dynamic", "packages": )" +
+           packages + R"(}, "faults": [)" + faults + "]}";
+}
+
+// Two packages of four cores with instance numbers unlike their positions.
+// Only the first core of each package has the package's own CPUID; in the
+// second package core 105 is the first busy one and 106 would fail if read.
+std::string twoPackages(const std::string &faults = "") {
+    return host(std::string(R"([
+        {"instance": 30, "cores": [
+            {"instance": 100, "cpuid": )") + intel + R"(},
+            {"instance": 101, "cpuid": )" + amd + R"(},
+            {"instance": 102, "cpuid": )" + amd + R"(},
+            {"instance": 103, "cpuid": )" + amd + R"(}]},
+        {"instance": 31, "cpuid": )" + intel + R"(, "cores": [
+            {"instance": 104, "cpuid": )" + amd + R"(},
+            {"instance": 105, "state": 1},
+            {"instance": 106, "state": 1},
+            {"instance": 107}]}])",
+                faults);
+}
+
+struct Taken {
+    unsigned int result;
+    std::vector<ProcessorDetails> records;
+};
+
+class ProcessorInventory : public testing::Test {
+protected:
+    void TearDown() override {
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << "a list was not freed";
+        HostSim_ResetProfile();
+    }
+
+    static Taken take(const std::string &profile) {
+        char error[256];
+        Taken taken{99, {}};
+        EXPECT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
+        taken.result = getProcessorDetails(taken.records);
+        return taken;
+    }
+};
+
+TEST_F(ProcessorInventory, EachPackageTakesItsFirstCoreAndIsEnabledByItsFirstBusyCore) {
+    const Taken taken = take(twoPackages(R"({"call": "PRB_Get", "node": 799, "instance": 106},
+                                            {"call": "PRB_Get", "node": 800, "instance": 106})"));
+    ASSERT_EQ(taken.result, 0u);
+    ASSERT_EQ(taken.records.size(), 2u);
+    const ProcessorDetails &first = taken.records[0];
+    const ProcessorDetails &second = taken.records[1];
+    EXPECT_STREQ(first.deviceId, "cpu-0");
+    EXPECT_STREQ(second.deviceId, "cpu-1");
+    EXPECT_EQ(first.enabledCores, 4u);
+    EXPECT_EQ(second.enabledCores, 4u);
+    EXPECT_EQ(first.vendor, 2u);
+    EXPECT_EQ(first.brandId, 0x0a);
+    EXPECT_EQ(first.virtualization, 1);
+    EXPECT_EQ(first.cpuStatus, 4u);
+    EXPECT_EQ(second.vendor, 3u);  // core 104's own CPUID, not its package's
+    EXPECT_EQ(second.brandId, 0x0b);
+    EXPECT_STREQ(second.stepping, "2");
+    EXPECT_EQ(second.cpuStatus, 1u);
+    for (const ProcessorDetails &record : taken.records) {
+        EXPECT_STREQ(record.modelName, "Xeon E5");
+        EXPECT_EQ(record.hyperThreading, 1);
+        EXPECT_EQ(record.powerManagement, 1);
+        EXPECT_EQ(record.dynamicPower, 1);
+    }
+}
+
+TEST_F(ProcessorInventory, CoreCountsSetWhereEachPackageStartsInTheCoreList) {
+    // The first package claims no cores, so the second starts at entry 0 too.
+    const Taken taken = take(host(std::string(R"([
+        {"coreCount": 0, "cores": [{"cpuid": )") + intel + R"(, "state": 1}]},
+        {"coreCount": 1, "cores": [{"cpuid": )" + amd + R"(}]}])",
+                                  R"({"call": "PRB_Get", "node": 799, "nth": 2})"));
+    ASSERT_EQ(taken.result, 0u);
+    ASSERT_EQ(taken.records.size(), 2u);
+    EXPECT_EQ(taken.records[0].cpuStatus, 4u);  // had it asked, the second package's query would fail
+    EXPECT_EQ(taken.records[1].vendor, 2u);
+    EXPECT_EQ(taken.records[1].cpuStatus, 1u);
+}
+
+TEST_F(ProcessorInventory, NoPackageListAtAllIsNotReadFurtherButAnEmptyOneIs) {
+    const std::string coreListFails = R"({"call": "PRB_GetInstanceListAlloc", "node": 607})";
+    const Taken none = take(host("null", coreListFails));
+    EXPECT_EQ(none.result, 0u);
+    EXPECT_TRUE(none.records.empty());
+    const Taken empty = take(host("[]", coreListFails));
+    EXPECT_EQ(empty.result, 1u);
+    EXPECT_TRUE(empty.records.empty());
+    EXPECT_EQ(take(host("[]")).result, 0u);
+}
+
+TEST_F(ProcessorInventory, EveryFailingCallGivesOneAndKeepsTheRecordsBeforeIt) {
+    const struct {
+        const char *fault;
+        std::size_t recordsLeft;
+    } cases[] = {
+        {R"({"call": "PRB_CheckSig"})", 0},
+        {R"({"call": "PRB_Get", "node": 1443})", 0},
+        {R"({"call": "PRB_Get", "node": 605})", 0},
+        {R"({"call": "PRB_Get", "node": 606})", 0},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 608})", 0},
+        {R"({"call": "PRB_ParamListCreate", "nth": 1})", 0},
+        {R"({"call": "PRB_ParamListGetInt32", "index": 1, "nth": 1})", 1},
+        {R"({"call": "PRB_ParamListAddInt", "value": 31})", 1},
+        {R"({"call": "PRB_Get", "node": 608, "instance": 31})", 1},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 607})", 2},
+        {R"({"call": "PRB_ParamListCreate", "nth": 2})", 2},
+        {R"({"call": "PRB_Get", "node": 607, "instance": 104})", 2},
+        {R"({"call": "PRB_Get", "node": 799, "instance": 103})", 2},
+        {R"({"call": "PRB_Get", "node": 800, "instance": 105})", 2},
+        {R"({"call": "PRB_ParamListAddInt", "value": 105})", 2},
+    };
+    for (const auto &c : cases) {
+        const Taken taken = take(twoPackages(c.fault));
+        EXPECT_EQ(taken.result, 1u) << c.fault;
+        EXPECT_EQ(taken.records.size(), c.recordsLeft) << c.fault;
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << c.fault;
+    }
+}
+
+TEST_F(ProcessorInventory, ACoreCountBeyondTheCoreListFailsInsteadOfRunningOn) {
+    const Taken taken = take(host(R"([{"coreCount": "0xffffffff", "cores": [{}, {}]}])"));
+    EXPECT_EQ(taken.result, 1u);
+    EXPECT_EQ(taken.records.size(), 1u);
+}
+
+}  // namespace
+}  // namespace Processor
