@@ -5,10 +5,13 @@
 
 #include "CmpiArray.h"
 #include "frame/BoundedText.h"
+#include "frame/SingleElementArray.h"
 #include "platform/OmcComputerSystem.h"
 
 namespace EthernetProvider {
 namespace {
+
+using frame::singleElementArray;
 
 constexpr CMPIUint16 linkTechnologyEthernet = 2;
 constexpr CMPIUint16 requestedStateNoChange = 5;
@@ -19,13 +22,6 @@ constexpr CMPIUint16 operationalStatusStopped = 10;
 constexpr CMPIUint16 elementSoftwareStatusCurrent = 2;
 constexpr uint32_t capabilityBit = 0x800;
 constexpr CMPIUint16 capabilityValue = 5;
-
-template <typename T>
-CmpiArray singleElementArray(CMPIType type, const T &value) {
-    CmpiArray array(1, type);
-    array[0] = CmpiData(value);
-    return array;
-}
 
 std::string formatted(const char *format, uint32_t value) {
     char text[32];

@@ -2,7 +2,6 @@
 
 #include <strings.h>
 
-#include <optional>
 #include <vector>
 
 #include "ethernet/EthernetPortObjects.h"
@@ -17,7 +16,7 @@ enum class ServedClass { port, driverIdentity, firmwareIdentity, driverElement, 
 bool matchServedClass(const CmpiString &className, ServedClass &served) {
     const struct {
         const char *name;
-        ServedClass served;
+        ServedClass served = ServedClass::port;
     } classes[] = {
         {portClass, ServedClass::port},
         {driverIdentityClass, ServedClass::driverIdentity},
@@ -40,23 +39,26 @@ const IdentityKind &identityOf(ServedClass served) {
                : firmwareIdentity;
 }
 
-struct Walk {
+// Every enumeration takes the inventory, then checks the class, then hands
+// `visit` each adapter with the class served; `visit` returns false to end
+// the walk early.
+template <class Visit>
+CmpiStatus walkAdapters(const CmpiObjectPath &cop, CmpiResult &rslt, Visit &&visit) {
     std::vector<PnicDetails> pnics;
-    ServedClass served = ServedClass::port;
-};
-
-// Every enumeration takes the inventory, then checks the class: the status
-// to answer at once, or nothing when the records are to be walked.
-std::optional<CmpiStatus> startWalk(const CmpiString &className, CmpiResult &rslt, Walk &walk) {
-    if (getPnicDetails(walk.pnics) != 0) {
+    if (getPnicDetails(pnics) != 0) {
         return CmpiStatus(CMPI_RC_ERR_FAILED, "Failed to get pnics information");
     }
-    if (walk.pnics.empty()) {
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+    if (!pnics.empty()) {
+        ServedClass served = ServedClass::port;
+        if (!matchServedClass(cop.getClassName(), served)) {
+            return CmpiStatus(CMPI_RC_ERR_INVALID_CLASS);
+        }
+        for (const PnicDetails &pnic : pnics) {
+            if (!visit(pnic, served)) break;
+        }
     }
-    if (!matchServedClass(className, walk.served)) return CmpiStatus(CMPI_RC_ERR_INVALID_CLASS);
-    return std::nullopt;
+    rslt.returnDone();
+    return CmpiStatus(CMPI_RC_OK);
 }
 
 }  // namespace
@@ -75,16 +77,10 @@ CmpiString EthernetPortProvider::getKey(const CmpiObjectPath &op, const char *na
 CmpiStatus EthernetPortProvider::enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
                                                    const CmpiObjectPath &cop) {
     const CmpiString ns = cop.getNameSpace();
-    Walk walk;
-    if (std::optional<CmpiStatus> answer = startWalk(cop.getClassName(), rslt, walk)) {
-        return *answer;
-    }
-    const ServedClass served = walk.served;
-
-    for (const PnicDetails &pnic : walk.pnics) {
+    return walkAdapters(cop, rslt, [&](const PnicDetails &pnic, ServedClass served) {
         if (served == ServedClass::port) {
             rslt.returnData(buildPortPath(ctx, getBroker(), ns, pnic.name));
-            continue;
+            return true;
         }
         const IdentityKind &kind = identityOf(served);
         const CmpiObjectPath identity = buildIdentityPath(kind, ns, pnic.name);
@@ -94,9 +90,8 @@ CmpiStatus EthernetPortProvider::enumInstanceNames(const CmpiContext &ctx, CmpiR
             const CmpiObjectPath port = buildPortPath(ctx, getBroker(), ns, pnic.name);
             rslt.returnData(buildElementPath(kind, ns, port, identity));
         }
-    }
-    rslt.returnDone();
-    return CmpiStatus(CMPI_RC_OK);
+        return true;
+    });
 }
 
 CmpiStatus EthernetPortProvider::enumInstances(const CmpiContext &ctx, CmpiResult &rslt,
@@ -110,14 +105,8 @@ CmpiStatus EthernetPortProvider::enumInstancesInt(const CmpiContext &ctx, CmpiRe
                                                   const char **properties,
                                                   const char *deviceName) {
     const CmpiString ns = cop.getNameSpace();
-    Walk walk;
-    if (std::optional<CmpiStatus> answer = startWalk(cop.getClassName(), rslt, walk)) {
-        return *answer;
-    }
-    const ServedClass served = walk.served;
-
-    for (const PnicDetails &pnic : walk.pnics) {
-        if (deviceName != nullptr && ::strcasecmp(pnic.name, deviceName) != 0) continue;
+    return walkAdapters(cop, rslt, [&](const PnicDetails &pnic, ServedClass served) {
+        if (deviceName != nullptr && ::strcasecmp(pnic.name, deviceName) != 0) return true;
         if (served == ServedClass::port) {
             rslt.returnData(buildPortInstance(ctx, getBroker(), ns, pnic, properties));
         } else if (served == ServedClass::driverIdentity ||
@@ -129,10 +118,8 @@ CmpiStatus EthernetPortProvider::enumInstancesInt(const CmpiContext &ctx, CmpiRe
                                                  buildPortPath(ctx, getBroker(), ns, pnic.name),
                                                  buildIdentityPath(kind, ns, pnic.name), true));
         }
-        if (deviceName != nullptr) break;
-    }
-    rslt.returnDone();
-    return CmpiStatus(CMPI_RC_OK);
+        return deviceName == nullptr;
+    });
 }
 
 CmpiStatus EthernetPortProvider::getInstance(const CmpiContext &ctx, CmpiResult &rslt,

@@ -4,6 +4,7 @@
 
 #include "CmpiArray.h"
 #include "CmpiObjectPath.h"
+#include "frame/SingleElementArray.h"
 #include "platform/OmcComputerSystem.h"
 
 namespace Processor {
@@ -27,12 +28,6 @@ constexpr Characteristic characteristics[] = {
     {&ProcessorDetails::powerManagement, 7},  // Power/Performance Control
 };
 constexpr unsigned int powerControlIndex = 4;
-
-CmpiArray oneElement(CMPIType type, const CmpiData &value) {
-    CmpiArray array(1, type);
-    array[0] = value;
-    return array;
-}
 
 void setCharacteristics(CmpiInstance &instance, const ProcessorDetails &record) {
     constexpr unsigned int count = sizeof characteristics / sizeof characteristics[0];
@@ -76,14 +71,14 @@ CmpiInstance buildProcessorInstance(const CmpiString &ns, const ProcessorDetails
     instance.setProperty("DeviceID", CmpiData(record.deviceId));
     instance.setProperty("ElementName", CmpiData(record.deviceId));
     instance.setProperty("OperationalStatus",
-                         oneElement(CMPI_uint16, CmpiData(operationalStatusOk)));
+                         frame::singleElementArray(CMPI_uint16, operationalStatusOk));
     instance.setProperty("Vendor", CmpiData(CMPIUint16(record.vendor)));
     instance.setProperty("NumberOfEnabledCores", CmpiData(CMPIUint16(record.enabledCores)));
     instance.setProperty("Stepping", CmpiData(record.stepping));
     instance.setProperty("ModelName", CmpiData(record.modelName));
-    instance.setProperty("OtherIdentifyingInfo", oneElement(CMPI_string, CmpiData(brand)));
+    instance.setProperty("OtherIdentifyingInfo", frame::singleElementArray(CMPI_string, brand));
     instance.setProperty("IdentifyingDescriptions",
-                         oneElement(CMPI_string, CmpiData("Brand ID")));
+                         frame::singleElementArray(CMPI_string, "Brand ID"));
     instance.setProperty("CPUStatus", CmpiData(CMPIUint16(record.cpuStatus)));
     setCharacteristics(instance, record);
     return instance;

@@ -52,18 +52,16 @@ CpuidProfile readCpuid(JsonObjectReader &fields) {
     return cpuid;
 }
 
-// The package's cpuid, or the defaults when it has none.
-CpuidProfile readPackageCpuid(JsonObjectReader &entry) {
-    CpuidProfile cpuid;
+// An entry's "cpuid" replaces `cpuid` whole; absent, `cpuid` stays.
+void readCpuidField(JsonObjectReader &entry, CpuidProfile &cpuid) {
     entry.object("cpuid", [&cpuid](JsonObjectReader &fields) { cpuid = readCpuid(fields); });
-    return cpuid;
 }
 
 void readCores(JsonObjectReader &package, const CpuidProfile &packageCpuid, InstanceTable<CoreProfile> &cores) {
     package.eachObject("cores", [&](JsonObjectReader &entry) {
         CoreProfile core;
         core.cpuid = packageCpuid;
-        entry.object("cpuid", [&core](JsonObjectReader &fields) { core.cpuid = readCpuid(fields); });
+        readCpuidField(entry, core.cpuid);
         readFlag(entry, "state", core.state);
         const std::optional<std::int32_t> instance = readInstanceNumber(entry);
         const std::uint64_t count = entry.unsignedInteger("count", 1, mostInstances).value_or(1);
@@ -81,7 +79,9 @@ void readPackages(JsonObjectReader &section, ProcessorProfile &processors) {
         PackageProfile package;
         package.instance = readInstanceNumber(entry).value_or(static_cast<std::int32_t>(processors.packages.size()));
         const std::size_t coresBefore = processors.cores.size();
-        readCores(entry, readPackageCpuid(entry), processors.cores);
+        CpuidProfile packageCpuid;
+        readCpuidField(entry, packageCpuid);
+        readCores(entry, packageCpuid, processors.cores);
         package.coreCount = static_cast<std::uint32_t>(processors.cores.size() - coresBefore);
         readNumber(entry, "coreCount", package.coreCount);
         entry.finish();
