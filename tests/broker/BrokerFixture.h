@@ -24,16 +24,12 @@ inline constexpr const char *kNs = "root/cimv2";
 
 inline ObjectPath classPath(const std::string &cls) { return ObjectPath{"", kNs, cls, {}}; }
 
-inline ObjectPath keyed(const std::string &cls, const std::string &key, const std::string &value) {
-    return ObjectPath{"", kNs, cls, {{key, CimValue::makeString(value)}}};
-}
-
 inline ObjectPath widget(const std::string &name, const std::string &cls = "Test_Widget") {
-    return keyed(cls, "Name", name);
+    return ObjectPath{"", kNs, cls, {{"Name", CimValue::makeString(name)}}};
 }
 
 inline ObjectPath gadget(const std::string &widgetName) {
-    return keyed("Test_Gadget", "Id", "gadget-" + widgetName);
+    return ObjectPath{"", kNs, "Test_Gadget", {{"Id", CimValue::makeString("gadget-" + widgetName)}}};
 }
 
 inline ObjectPath link(const ObjectPath &owner, const ObjectPath &part) {

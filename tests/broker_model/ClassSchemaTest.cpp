@@ -38,9 +38,6 @@ class TST_Link {
 class TST_Derived : tst_base {
     string InstanceID;
     [Key] sint64 Serial;
-    real32 Ratio;
-    datetime Since;
-    char16 Letter;
     uint8 Bytes[4];
     real64 Ref;
 };
@@ -63,8 +60,6 @@ protected:
 TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
     const ClassDecl *base = schema.find("tst_BASE");
     ASSERT_NE(base, nullptr);
-    EXPECT_EQ(base->name, "TST_Base");
-    EXPECT_EQ(base->superclass, "");
     ASSERT_EQ(base->properties.size(), 4u);  // the method is not a property
 
     const ClassDecl *derived = schema.find("TST_Derived");
@@ -84,13 +79,9 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         {"TST_Base", "NotKey", CMPI_boolean, "", false},
         {"TST_Link", "Dependent", CMPI_ref, "TST_Base", true},
         {"TST_Derived", "Serial", CMPI_sint64, "", true},
-        {"TST_Derived", "Ratio", CMPI_real32, "", false},
-        {"TST_Derived", "Since", CMPI_dateTime, "", false},
-        {"TST_Derived", "Letter", CMPI_char16, "", false},
         {"TST_Derived", "Bytes", CMPI_uint8A, "", false},
         {"TST_Derived", "Ref", CMPI_real64, "", false},
         {"TST_Derived", "Caption", CMPI_string, "", false},
-        {"TST_Alert", "message", CMPI_string, "", false},
     };
     for (const Expected &e : expected) {
         const PropertyDecl *p = schema.findProperty(e.cls, e.prop);
@@ -99,22 +90,19 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         EXPECT_EQ(p->referenceClass, e.referenceClass) << e.prop;
         EXPECT_EQ(p->key, e.key) << e.prop;
     }
-    EXPECT_EQ(schema.findProperty("TST_Base", "Reset"), nullptr);
     EXPECT_EQ(schema.findProperty("TST_Base", "Serial"), nullptr);
     EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
 }
 
+// Subclasses and associations on real classes show in the broker's dispatch
+// tests; here the spelling, inherited qualifiers and undeclared names.
 TEST_F(ClassSchemaTest, HierarchyQueries) {
     EXPECT_TRUE(schema.isA("tst_derived", "TST_BASE"));
-    EXPECT_TRUE(schema.isA("TST_Base", "TST_Base"));
     EXPECT_FALSE(schema.isA("TST_Base", "TST_Derived"));
     EXPECT_FALSE(schema.isA("Nope", "Nope"));
-    EXPECT_FALSE(schema.isA("TST_Derived", "Nope"));
     EXPECT_EQ(schema.selfAndSubclasses("tst_base"), (std::vector<std::string>{"TST_Base", "TST_Derived"}));
     EXPECT_TRUE(schema.selfAndSubclasses("Nope").empty());
-
     EXPECT_TRUE(schema.isAssociation("TST_Link"));
-    EXPECT_FALSE(schema.isAssociation("TST_Base"));
     EXPECT_TRUE(schema.isIndication("tst_alert"));
     EXPECT_FALSE(schema.isIndication("TST_Link"));
     EXPECT_FALSE(schema.isIndication("Nope"));
@@ -131,6 +119,8 @@ TEST_F(ClassSchemaTest, KeysComeBaseFirstWithOverridesOnce) {
 }
 
 TEST_F(ClassSchemaTest, LoadsAccumulateAndFailedLoadsLeaveNothing) {
+    schema.loadText("", "empty.mof");
+    schema.loadText("\xEF\xBB\xBF// only a comment\n#pragma namespace(\"root/cimv2\")\n", "bom.mof");
     schema.loadText("class TST_More : TST_Alert { };", "more.mof");
     EXPECT_TRUE(schema.isIndication("TST_More"));
     EXPECT_THROW(schema.loadText("class TST_A {}; class TST_B : TST_Missing {};", "bad.mof"), std::runtime_error);
@@ -156,36 +146,21 @@ TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
         {"class A { string s; uint8 S; };", "t.mof:1: property S declared twice in class A"},
         {"class A : B { };", "t.mof:1: superclass B of A is not declared"},
         {"\n\nclass known { };", "t.mof:3: class known is already declared"},
-        {"class A { }; class a { };", "t.mof:1: class a is already declared"},
         {"[Key(] class A {};", "t.mof:1: expected ')', found ']'"},
         {"class A {\n [Description(\"x\"", "t.mof:2: '(' never closed"},
-        {"[Key(}] class A {};", "t.mof:1: expected ')', found '}'"},
         {"[Key class A {};", "t.mof:1: expected ',' or ']', found 'class'"},
-        {"[Key] Qualifier Key : boolean;",
-         "t.mof:1: expected a class, instance or qualifier declaration, found 'Qualifier'"},
         {"instance A { };", "t.mof:1: expected 'of', found 'A'"},
         {"Qualifier Key : boolean = false", "t.mof:1: expected ';', found end of input"},
         {"#include \"x.mof\"", "t.mof:1: unknown directive '#include'"},
-        {"class A { string \x01; };", "t.mof:1: unexpected byte 0x01"},
         {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
         {"\x89PNG\r\n\x1a\n", "t.mof:1: unexpected byte 0x89"},
         {"class A { } ;;", "t.mof:1: expected a class, instance or qualifier declaration, found ';'"},
-        {"class A { uint8 b[; };", "t.mof:1: expected ']', found ';'"},
-        {"class { };", "t.mof:1: expected a class name, found '{'"},
     };
     for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;
 }
 
-TEST(ClassSchemaErrors, EmptyAndCommentOnlyTextDeclareNothing) {
-    ClassSchema schema;
-    schema.loadText("", "empty.mof");
-    schema.loadText("\xEF\xBB\xBF// only a comment\n#pragma namespace(\"root/cimv2\")\n", "bom.mof");
-    EXPECT_TRUE(schema.selfAndSubclasses("CIM_ManagedElement").empty());
-}
-
 TEST(ClassSchemaErrors, FilesAreNamedInMessages) {
     ClassSchema schema;
-    EXPECT_EQ(errorOf([&] { schema.loadFile("/nonexistent/x.mof"); }), "cannot read /nonexistent/x.mof");
     EXPECT_EQ(errorOf([&] { schema.loadFile("/"); }), "cannot read /");
 
     const std::string path = ::testing::TempDir() + "schema_test.mof";

@@ -8,17 +8,11 @@ namespace tvxbroker {
 namespace {
 
 ObjectPath pathOf(const std::string &cls, const std::string &key) {
-    ObjectPath path;
-    path.nameSpace = "root/cimv2";
-    path.className = cls;
-    path.keys.push_back({"Name", CimValue::makeString(key)});
-    return path;
+    return ObjectPath{"", "root/cimv2", cls, {{"Name", CimValue::makeString(key)}}};
 }
 
 TEST(MofInstanceText, WritesEveryKindOfValue) {
-    Instance inner;
-    inner.path = pathOf("TST_Inner", "in");
-
+    const Instance inner{pathOf("TST_Inner", "in"), {}};
     Instance instance;
     instance.path = pathOf("TST_Thing", "line1\nline2 \"q\"");
     instance.properties = {
@@ -55,12 +49,6 @@ TEST(MofInstanceText, WritesEveryKindOfValue) {
               "    Empty = {};\n"
               "    NoArray = NULL;\n"
               "};\n");
-}
-
-TEST(MofInstanceText, InstanceWithoutProperties) {
-    Instance instance;
-    instance.path.className = "TST_Bare";
-    EXPECT_EQ(formatInstanceMof(instance), "// TST_Bare\ninstance of TST_Bare\n{\n};\n");
 }
 
 }  // namespace

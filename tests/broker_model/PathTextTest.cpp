@@ -51,31 +51,23 @@ TEST_F(PathTextTest, ValuesTakeTheDeclaredType) {
     const ObjectPath path = parsePath(
         "ns:tst_sub.small=7,FLAG=true,other=\"root/cimv2:TST_Other.K=\\\"v\\\"\",When=\"20240101130000.000000+060\"",
         schema);
-    EXPECT_EQ(path.nameSpace, "ns");
-    EXPECT_EQ(path.className, "TST_Sub");
-    ASSERT_EQ(path.keys.size(), 4u);
-    EXPECT_EQ(path.keys[0].name, "Small");
-    EXPECT_EQ(path.keys[0].value, CimValue::makeUnsigned(CMPI_uint8, 7));
-    EXPECT_EQ(path.keys[1].value, CimValue::makeBoolean(true));
-    ObjectPath other;
-    other.nameSpace = "root/cimv2";
-    other.className = "TST_Other";
-    other.keys.push_back({"K", CimValue::makeString("v")});
-    EXPECT_EQ(path.keys[2].value, CimValue::makeReference(other));
-    EXPECT_EQ(path.keys[3].value, CimValue::makeDateTime({19723ull * 86400 * 1000000 + 12ull * 3600 * 1000000, false}));
+    const ObjectPath other{"", "root/cimv2", "TST_Other", {{"K", CimValue::makeString("v")}}};
+    const DateTime noonUtc{19723ull * 86400 * 1000000 + 12ull * 3600 * 1000000, false};
+    EXPECT_EQ(path, (ObjectPath{"", "ns", "TST_Sub",
+                                {{"Small", CimValue::makeUnsigned(CMPI_uint8, 7)},
+                                 {"Flag", CimValue::makeBoolean(true)},
+                                 {"Other", CimValue::makeReference(other)},
+                                 {"When", CimValue::makeDateTime(noonUtc)}}}));
+    // The spelling and order of names, which equality ignores.
     EXPECT_EQ(formatPath(path),
               "ns:TST_Sub.Small=7,Flag=TRUE,Other=\"root/cimv2:TST_Other.K=\\\"v\\\"\","
               "When=\"20240101120000.000000+000\"");
 }
 
 TEST_F(PathTextTest, FormatShowsWhatParseCannotReadAndRejectsArrays) {
-    ObjectPath path;
-    path.className = "TST_Other";
-    path.keys.push_back({"K", CimValue::makeString("x")});
+    ObjectPath path{"", "", "TST_Other", {{"K", CimValue::makeString("x")}}};
     EXPECT_EQ(formatPath(path), "TST_Other.K=\"x\"");
-    Instance embedded;
-    embedded.path = path;
-    path.keys.push_back({"E", CimValue::makeInstance(embedded)});
+    path.keys.push_back({"E", CimValue::makeInstance(Instance{path, {}})});
     EXPECT_EQ(formatPath(path), "TST_Other.K=\"x\",E=\"TST_Other.K=\\\"x\\\"\"");
     path.keys.push_back({"Tags", CimValue::makeArray(CMPI_string, {})});
     EXPECT_THROW(formatPath(path), std::invalid_argument);
@@ -83,20 +75,16 @@ TEST_F(PathTextTest, FormatShowsWhatParseCannotReadAndRejectsArrays) {
 
 TEST_F(PathTextTest, ErrorsNameProblemAndPosition) {
     const std::pair<std::string, std::string> cases[] = {
-        {"", "missing ':' after the namespace at position 0"},
         {"TST_Other.K=\"x\"", "missing ':' after the namespace at position 15"},
         {":TST_Other", "empty namespace at position 0"},
         {"ns:", "empty class name at position 3"},
-        {"ns:.K=1", "empty class name at position 3"},
         {"ns:Nope.K=1", "unknown class Nope at position 3"},
         {"ns:TST_Other.Z=\"x\"", "class TST_Other has no property Z at position 13"},
         {"ns:TST_Other.K=\"x", "unterminated quoted value at position 15"},
         {"ns:TST_Other.K=\"x\\n\"", "invalid escape at position 17"},
         {"ns:TST_Other.K", "missing '=' after key K at position 14"},
-        {"ns:TST_Other.K\"x\"", "missing '=' after key K at position 14"},
         {"ns:TST_Other.K=\"x\"y", "unexpected character 'y' at position 18"},
         {"ns:TST_Other.K=\"x\",", "expected a key name at position 19"},
-        {"ns:TST_Other.", "expected a key name at position 13"},
         {"ns:TST_Other K=1", "unexpected character ' ' at position 12"},
         {"ns:TST_Other.K=\"x\",k=\"y\"", "duplicate key k at position 19"},
         {"ns:TST_Other.K=", "missing value of key K at position 15"},
@@ -116,20 +104,17 @@ TEST_F(PathTextTest, ErrorsNameProblemAndPosition) {
         {"ns:TST_Thing.Tags=\"x\"", "property Tags has a type that cannot appear in a path at position 18"},
         {"ns:TST_Thing.Other=\"ns:Nope\"",
          "invalid reference in Other (unknown class Nope at position 3) at position 19"},
+        // Garbage that must end in an error, not a read past the end.
+        {std::string("ns:TST_Other.K=\"\0\"", 18) + std::string(1, '\xff'),
+         "unexpected character '\xFF' at position 18"},
+        {"ns:TST_Other.K=\"\\", "invalid escape at position 16"},
+        {"ns:TST_Thing.Other=\"ns:TST_Thing.Other=\\\"ns:TST_Thing.Other=\\\\\\\"\\\"\"",
+         "invalid reference in Other (invalid reference in Other (unterminated quoted value at position 19) "
+         "at position 19) at position 19"},
     };
     for (const auto &c : cases) {
         EXPECT_EQ(errorOf<PathParseError>([&] { parsePath(c.first, schema); }), c.second) << c.first;
     }
-}
-
-TEST_F(PathTextTest, GarbageNeverCrashes) {
-    const std::string garbage[] = {
-        std::string("ns:TST_Other.K=\"\0\"", 18) + std::string(1, '\xff'),
-        "ns:TST_Other.K=\"\\",
-        "::::",
-        "ns:TST_Thing.Other=\"ns:TST_Thing.Other=\\\"ns:TST_Thing.Other=\\\\\\\"\\\"\"",
-    };
-    for (const std::string &text : garbage) EXPECT_THROW(parsePath(text, schema), PathParseError) << text;
 }
 
 }  // namespace

@@ -10,10 +10,9 @@
 namespace tvxbroker {
 namespace {
 
+// The plain layout is read in every broker test; here what it may vary in.
 TEST(ProviderRegistration, ReadsBlocks) {
     const std::vector<ProviderRegistration> regs = parseRegistration(
-        "# sfcb registrations\n"
-        "\n"
         "[TVX_Disk]\n"
         "   provider: TvxDiskProvider\n"
         "   location: tvxdisk\r\n"
@@ -30,13 +29,8 @@ TEST(ProviderRegistration, ReadsBlocks) {
         "reg");
     ASSERT_EQ(regs.size(), 2u);
     const ProviderRegistration &disk = regs[0];
-    EXPECT_EQ(disk.className, "TVX_Disk");
-    EXPECT_EQ(disk.providerName, "TvxDiskProvider");
     EXPECT_EQ(disk.location, "tvxdisk");
-    EXPECT_TRUE(disk.instance);
-    EXPECT_TRUE(disk.method);
-    EXPECT_FALSE(disk.association);
-    EXPECT_FALSE(disk.indication);
+    EXPECT_TRUE(disk.instance && disk.method);
     EXPECT_EQ(disk.namespaces, (std::vector<std::string>{"root/cimv2", "root/interop"}));
     const ProviderRegistration &link = regs[1];
     EXPECT_EQ(link.location, "tvxlink");
@@ -60,14 +54,10 @@ TEST(ProviderRegistration, ErrorsNameTheLine) {
         {"[C\n", "reg:1: expected '[ClassName]'"},
         {"[]\n", "reg:1: expected '[ClassName]'"},
         {"[A B]\n", "reg:1: expected '[ClassName]'"},
+        {"[1a]\n", "reg:1: expected '[ClassName]'"},
         {std::string("[C]\n\0\x01\xff\n", 8), "reg:2: expected 'key: value'"},
     };
     for (const auto &c : cases) EXPECT_EQ(errorOf([&] { parseRegistration(c.first, "reg"); }), c.second) << c.first;
-}
-
-TEST(ProviderRegistration, MissingFile) {
-    EXPECT_EQ(errorOf([] { readRegistrationFile("/nonexistent/providerRegister"); }),
-              "cannot read /nonexistent/providerRegister");
 }
 
 }  // namespace

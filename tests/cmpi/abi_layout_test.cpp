@@ -1,6 +1,7 @@
 // Pins the CMPI 2.0 binary layout a broker such as sfcb relies on: where each
 // table's functions start and end and how many it has, selected slots, the
-// data structures and the numeric codes. Builds for x86_64 and i386 alike.
+// data structures and the type codes the header builds from bit fields.
+// Builds for x86_64 and i386 alike.
 #include <gtest/gtest.h>
 
 #include <cstddef>
@@ -138,26 +139,6 @@ TEST(CmpiAbi, TypeCodesAndValueStates) {
         {CMPI_notFound, 0x400},  {CMPI_badValue, 0x8000},
     };
     for (const auto &c : codes) EXPECT_EQ(c[0], c[1]);
-}
-
-TEST(CmpiAbi, StatusCodesFlagsAndEnums) {
-    const long pairs[][2] = {
-        {CMPI_RC_OK, 0},           {CMPI_RC_ERR_FAILED, 1},        {CMPI_RC_ERR_NOT_FOUND, 6},
-        {CMPI_RC_ERR_NOT_SUPPORTED, 7}, {CMPI_RC_ERR_TYPE_MISMATCH, 13},
-        {CMPI_RC_ERR_METHOD_NOT_FOUND, 17}, {CMPI_RC_DO_NOT_UNLOAD, 50},
-        {CMPI_RC_NEVER_UNLOAD, 51}, {CMPI_RC_ERR_INVALID_HANDLE, 60},
-        {CMPI_RC_ERR_INVALID_DATA_TYPE, 61}, {CMPI_RC_ERROR_SYSTEM, 100}, {CMPI_RC_ERROR, 200},
-        {CMPI_FLAG_LocalOnly, 1},  {CMPI_FLAG_DeepInheritance, 2},
-        {CMPI_FLAG_IncludeQualifiers, 4}, {CMPI_FLAG_IncludeClassOrigin, 8},
-        {CMPI_MB_BasicRead, 0x1},  {CMPI_MB_InstanceManipulation, 0x7},
-        {CMPI_MB_Indications, 0x81}, {CMPI_MB_OSEncapsulationSupport, 0x100},
-        {CMPI_MB_Supports_MemEnhancements, 0x4000}, {CMPI_MB_Supports_Extended_Error, 0x8000},
-        {CMPI_PredOp_Equals, 1},   {CMPI_PredOp_NotLike, 10},      {CMPI_PredOp_Or, 14},
-        {CMPI_SEV_ERROR, 1},       {CMPI_DEV_DEBUG, 4},            {CMPI_LEV_VERBOSE, 3},
-        {CMPI_COND_COD, 1},        {UnsupportedOperationError, 10}, {ErrorSevLow, 2},
-        {ErrorSevFatal, 5},        {CIMObjectHandle, 2},           {CMPIVersion200, 200},
-    };
-    for (const auto &p : pairs) EXPECT_EQ(p[0], p[1]);
 }
 
 }  // namespace

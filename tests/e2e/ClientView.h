@@ -14,22 +14,14 @@ namespace consistency {
 // MOF declares them, keys in name order (references within likewise) and
 // without the host.
 std::string canonicalText(const tvxbroker::ObjectPath &path, const tvxbroker::ClassSchema &schema);
-std::vector<std::string> canonicalTexts(const std::vector<tvxbroker::ObjectPath> &paths,
-                                        const tvxbroker::ClassSchema &schema);
 
 // The instance's class and namespace with the values of every key property
 // the MOF declares for its class; a key the instance lacks is left out.
 tvxbroker::ObjectPath nameOf(const tvxbroker::Instance &instance, const tvxbroker::ClassSchema &schema);
-std::vector<std::string> canonicalNames(const std::vector<tvxbroker::Instance> &instances,
-                                        const tvxbroker::ClassSchema &schema);
-
-struct Role {
-    std::string name;
-    std::string referenceClass;
-};
 
 // The reference properties of an association class, inherited ones
 // included, each once.
-std::vector<Role> rolesOf(const std::string &associationClass, const tvxbroker::ClassSchema &schema);
+std::vector<tvxbroker::PropertyDecl> rolesOf(const std::string &associationClass,
+                                             const tvxbroker::ClassSchema &schema);
 
 }  // namespace consistency

@@ -7,22 +7,27 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <cstdlib>
 #include <map>
 #include <set>
 
 #include "ClientView.h"
-#include "SuiteFiles.h"
 #include "model/MofInstanceText.h"
 #include "model/PathText.h"
 #include "tvxcim/StatusText.h"
 
-namespace consistency {
 namespace {
 
+using namespace consistency;
 using namespace tvxbroker;
 using testing::UnorderedElementsAreArray;
+using tvxcim::describeFailure;
+
+// What the suite runs on, fixed when it is built (tvx_add_consistency_suite).
+const char *const kProviderDir = TVX_SUITE_PROVIDER_DIR;
+const char *const kRegistration = TVX_SUITE_REGISTRATION;
+const std::vector<std::string> kMofFiles = {TVX_SUITE_MOFS};
+const std::vector<std::string> kEnvironment = {TVX_SUITE_ENVIRONMENT};  // NAME=value
 
 enum class Deviation {
     ProviderUnavailable,        // every request for the class fails with CMPI_RC_ERR_FAILED
@@ -82,8 +87,6 @@ std::vector<std::string> servedClasses(bool ProviderRegistration::*kind) {
     return classes;
 }
 
-std::string failureOf(const Response &response) { return tvxcim::describeFailure(response); }
-
 // Before any provider is loaded, as under ctest so when run by hand.
 class SuiteVariables : public testing::Environment {
 public:
@@ -103,7 +106,7 @@ TEST(ConsistencySuite, RegistrationServesInstances) {
     EXPECT_FALSE(servedClasses(&ProviderRegistration::instance).empty()) << kRegistration;
 }
 
-class ClientComparison : public testing::TestWithParam<std::string> {
+class ServedClass : public testing::TestWithParam<std::string> {
 protected:
     // In the first namespace the registration serves the class under test
     // in; the classes at an association's ends are looked for there too.
@@ -117,74 +120,56 @@ protected:
         return ObjectPath{"", "", className, {}};
     }
 
-    const ClassSchema &schema() const { return broker.schema(); }
+    std::string text(const ObjectPath &path) const { return canonicalText(path, broker.schema()); }
 
-    // The path with only the keys its class declares: where an extra key is
-    // expected it must be there, and it is taken off.
-    ObjectPath declaredKeys(const ObjectPath &path) const {
-        const ExpectedException *extra = expected(path.className, Deviation::PathWithExtraKey);
-        if (extra == nullptr) return path;
-        ObjectPath declared = path;
-        const std::size_t before = declared.keys.size();
-        declared.keys.erase(std::remove_if(declared.keys.begin(), declared.keys.end(),
-                                           [&](const NamedValue &key) {
-                                               return equalsIgnoreCase(key.name, extra->extraKey);
-                                           }),
-                            declared.keys.end());
-        EXPECT_EQ(declared.keys.size() + 1, before) << extra->reason;
-        return declared;
-    }
-
-    std::vector<std::string> declaredTexts(const std::vector<ObjectPath> &paths) const {
-        std::vector<std::string> texts;
-        for (const ObjectPath &path : paths) texts.push_back(canonicalText(declaredKeys(path), schema()));
-        return texts;
+    // The name a client builds from the instance's keys, with the extra key
+    // where one is expected.
+    ObjectPath expectedName(const Instance &instance) const {
+        ObjectPath name = nameOf(instance, broker.schema());
+        if (const ExpectedException *extra = expected(instance.path.className, Deviation::PathWithExtraKey)) {
+            const CimValue *value = instance.property(extra->extraKey);
+            EXPECT_NE(value, nullptr) << extra->reason;
+            if (value != nullptr) name.keys.push_back({extra->extraKey, *value});
+        }
+        return name;
     }
 
     // The instance's own path is its name, but where an exception is listed
     // and may apply: a reference must name its association in full.
     void checkOwnPath(const Instance &instance, bool exceptionsApply) const {
-        const ObjectPath name = nameOf(instance, schema());
-        if (const ExpectedException *extra = expected(instance.path.className, Deviation::PathWithExtraKey)) {
-            const CimValue *key = instance.path.key(extra->extraKey);
-            const CimValue *property = instance.property(extra->extraKey);
-            ASSERT_TRUE(key != nullptr && property != nullptr) << extra->reason;
-            EXPECT_EQ(*key, *property) << extra->reason;
-            EXPECT_EQ(canonicalText(declaredKeys(instance.path), schema()), canonicalText(name, schema()));
-            return;
-        }
+        ObjectPath name = expectedName(instance);
         const ExpectedException *fewerKeys =
-            exceptionsApply ? expected(instance.path.className, Deviation::InstancePathWithFewerKeys)
-                            : nullptr;
-        if (fewerKeys == nullptr) {
-            EXPECT_EQ(canonicalText(instance.path, schema()), canonicalText(name, schema()));
-            return;
+            exceptionsApply ? expected(instance.path.className, Deviation::InstancePathWithFewerKeys) : nullptr;
+        if (fewerKeys != nullptr) {
+            EXPECT_LT(instance.path.keys.size(), name.keys.size()) << fewerKeys->reason;
+            std::vector<NamedValue> carried;
+            for (const NamedValue &key : instance.path.keys) {
+                if (const CimValue *value = name.key(key.name)) carried.push_back({key.name, *value});
+            }
+            name.keys = carried;
         }
-        EXPECT_LT(instance.path.keys.size(), name.keys.size()) << fewerKeys->reason;
-        ObjectPath carried = name;
-        carried.keys.clear();
-        for (const NamedValue &key : instance.path.keys) {
-            if (const CimValue *value = name.key(key.name)) carried.keys.push_back({key.name, *value});
-        }
-        EXPECT_EQ(canonicalText(instance.path, schema()), canonicalText(carried, schema())) << fewerKeys->reason;
+        EXPECT_EQ(text(instance.path), text(name)) << (fewerKeys != nullptr ? fewerKeys->reason : "");
     }
 
     // The names one request gave are those of the instances its twin gave.
     void checkNamesOfInstances(const Response &names, const Response &instances,
                                bool exceptionsApply = true) const {
-        ASSERT_TRUE(names.ok()) << failureOf(names);
-        ASSERT_TRUE(instances.ok()) << failureOf(instances);
-        EXPECT_THAT(declaredTexts(names.paths),
-                    UnorderedElementsAreArray(canonicalNames(instances.instances, schema())));
-        for (const Instance &instance : instances.instances) checkOwnPath(instance, exceptionsApply);
+        ASSERT_TRUE(names.ok()) << describeFailure(names);
+        ASSERT_TRUE(instances.ok()) << describeFailure(instances);
+        std::vector<std::string> named;
+        std::vector<std::string> enumerated;
+        for (const ObjectPath &path : names.paths) named.push_back(text(path));
+        for (const Instance &instance : instances.instances) {
+            enumerated.push_back(text(expectedName(instance)));
+            checkOwnPath(instance, exceptionsApply);
+        }
+        EXPECT_THAT(named, UnorderedElementsAreArray(enumerated));
     }
 
     Broker broker{suiteConfig()};
 };
 
-class ServedClass : public ClientComparison {};
-
-TEST_P(ServedClass, NamesAreTheKeysOfTheInstances) {
+TEST_P(ServedClass, NamesAreTheKeysOfTheInstancesAndEachGetsItsInstance) {
     const Response names = broker.enumInstanceNames(classPath(GetParam()));
     const Response instances = broker.enumInstances(classPath(GetParam()), std::nullopt);
     if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
@@ -193,32 +178,20 @@ TEST_P(ServedClass, NamesAreTheKeysOfTheInstances) {
         return;
     }
     checkNamesOfInstances(names, instances);
-}
-
-TEST_P(ServedClass, EachNameGetsTheEnumeratedInstance) {
-    if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
-        GTEST_SKIP() << unavailable->reason;
-    }
-    const Response names = broker.enumInstanceNames(classPath(GetParam()));
-    const Response instances = broker.enumInstances(classPath(GetParam()), std::nullopt);
-    ASSERT_TRUE(names.ok()) << failureOf(names);
-    ASSERT_TRUE(instances.ok()) << failureOf(instances);
+    if (HasFatalFailure()) return;
     std::map<std::string, const Instance *> enumerated;
-    for (const Instance &instance : instances.instances) {
-        enumerated[canonicalText(nameOf(instance, schema()), schema())] = &instance;
-    }
+    for (const Instance &instance : instances.instances) enumerated[text(expectedName(instance))] = &instance;
     const ExpectedException *noGet = expected(GetParam(), Deviation::NoGetInstance);
     for (const ObjectPath &name : names.paths) {
-        const std::string text = canonicalText(declaredKeys(name), schema());
         const Response got = broker.getInstance(name, std::nullopt);
         if (noGet != nullptr) {
-            EXPECT_EQ(got.rc, CMPI_RC_ERR_NOT_SUPPORTED) << text << ": " << noGet->reason;
+            EXPECT_EQ(got.rc, CMPI_RC_ERR_NOT_SUPPORTED) << text(name) << ": " << noGet->reason;
             continue;
         }
-        ASSERT_TRUE(got.ok()) << text << ": " << failureOf(got);
-        ASSERT_EQ(got.instances.size(), 1U) << text;
-        const auto found = enumerated.find(text);
-        ASSERT_NE(found, enumerated.end()) << text << " has no enumerated instance";
+        ASSERT_TRUE(got.ok()) << text(name) << ": " << describeFailure(got);
+        ASSERT_EQ(got.instances.size(), 1U) << text(name);
+        const auto found = enumerated.find(text(name));
+        ASSERT_NE(found, enumerated.end()) << text(name) << " has no enumerated instance";
         EXPECT_EQ(got.instances.front(), *found->second)
             << "got:\n" << formatInstanceMof(got.instances.front())
             << "enumerated:\n" << formatInstanceMof(*found->second);
@@ -230,15 +203,15 @@ INSTANTIATE_TEST_SUITE_P(Registered, ServedClass, testing::ValuesIn(servedClasse
 
 // Each association is walked from the first instance at each of its ends
 // that takes part in one.
-class ServedAssociation : public ClientComparison {
+class ServedAssociation : public ServedClass {
 protected:
     void SetUp() override {
         if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
             GTEST_SKIP() << unavailable->reason;
         }
-        for (const Role &role : rolesOf(GetParam(), schema())) {
+        for (const PropertyDecl &role : rolesOf(GetParam(), broker.schema())) {
             const Response names = broker.enumInstanceNames(classPath(role.referenceClass));
-            ASSERT_TRUE(names.ok()) << role.referenceClass << ": " << failureOf(names);
+            ASSERT_TRUE(names.ok()) << role.referenceClass << ": " << describeFailure(names);
             for (const ObjectPath &name : names.paths) {
                 const Response associated = broker.associatorNames(name, GetParam(), "", "", "");
                 if (associated.ok() && !associated.paths.empty()) {
@@ -253,22 +226,14 @@ protected:
     std::vector<ObjectPath> starts;
 };
 
-TEST_P(ServedAssociation, AssociatorNamesAreTheKeysOfTheAssociators) {
+TEST_P(ServedAssociation, AssociatorAndReferenceNamesAreTheKeysOfTheirInstances) {
     for (const ObjectPath &start : starts) {
         SCOPED_TRACE(formatPath(start));
-        const Response names = broker.associatorNames(start, GetParam(), "", "", "");
-        const Response instances = broker.associators(start, GetParam(), "", "", "", std::nullopt);
-        checkNamesOfInstances(names, instances);
-    }
-}
-
-TEST_P(ServedAssociation, ReferenceNamesAreTheKeysOfTheReferences) {
-    for (const ObjectPath &start : starts) {
-        SCOPED_TRACE(formatPath(start));
+        checkNamesOfInstances(broker.associatorNames(start, GetParam(), "", "", ""),
+                              broker.associators(start, GetParam(), "", "", "", std::nullopt));
         const Response names = broker.referenceNames(start, GetParam(), "");
-        const Response instances = broker.references(start, GetParam(), "", std::nullopt);
         EXPECT_FALSE(names.paths.empty()) << "an instance that has associators has references too";
-        checkNamesOfInstances(names, instances, false);
+        checkNamesOfInstances(names, broker.references(start, GetParam(), "", std::nullopt), false);
     }
 }
 
@@ -279,4 +244,3 @@ INSTANTIATE_TEST_SUITE_P(Registered, ServedAssociation,
                          [](const auto &test) { return test.param; });
 
 }  // namespace
-}  // namespace consistency

@@ -9,7 +9,10 @@ foreach(run IN ITEMS seconds interrupt)
     execute_process(COMMAND ${EMULATOR} ${TVXCIM} listen --seconds 3
                     RESULT_VARIABLE status OUTPUT_VARIABLE shown ERROR_VARIABLE errors)
   else()
-    execute_process(COMMAND timeout --preserve-status -s INT 5 ${EMULATOR} ${TVXCIM} listen
+    # --foreground: one SIGINT to tvxcim alone, as Ctrl-C sends; otherwise
+    # timeout signals its process group too, and a second SIGINT arriving
+    # after the first was handled ends tvxcim with status 130.
+    execute_process(COMMAND timeout --foreground --preserve-status -s INT 5 ${EMULATOR} ${TVXCIM} listen
                     RESULT_VARIABLE status OUTPUT_VARIABLE shown ERROR_VARIABLE errors)
   endif()
   string(TIMESTAMP after "%Y%m%d%H%M%S" UTC)

@@ -1,52 +1,52 @@
-// The product library in the embedded broker, serving a host profile given
-// as text, with the answers reduced to what a client compares.
+// The Ethernet port provider in the embedded broker, with the paths of its
+// classes and a host profile of two adapters.
 #pragma once
 
-#include <gtest/gtest.h>
-
-#include <map>
-#include <memory>
-#include <string>
-#include <vector>
-
-#include "core/Broker.h"
+#include "ProductBroker.h"
 
 namespace ethernettest {
 
-using namespace tvxbroker;
+using namespace producttest;
 
-inline constexpr const char *kNs = "root/cimv2";
-// Served by the Ethernet port provider in these tests only, so that a class
-// the provider does not know reaches it.
+// Served by the Ethernet port provider in these tests only.
 inline constexpr const char *kUnservedClass = "Test_UnservedPort";
 
-class EthernetBroker : public testing::Test {
+class EthernetBroker : public ProductBroker {
 protected:
-    void SetUp() override;
-    void TearDown() override;
+    EthernetBroker() : ProductBroker("Talvex_EthernetPort", kUnservedClass) {}
 
-    void serve(const std::string &profileJson);
+    ObjectPath portPath(const std::string &deviceId) const {
+        return ObjectPath{"", kNs, "Talvex_EthernetPort",
+                          {{"DeviceID", CimValue::makeString(deviceId)},
+                           {"SystemCreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")},
+                           {"SystemName", CimValue::makeString(hostName)},
+                           {"CreationClassName", CimValue::makeString("Talvex_EthernetPort")}}};
+    }
 
-    static ObjectPath classPath(const std::string &cls);
-    ObjectPath portPath(const std::string &deviceId) const;
-    static ObjectPath identityPath(const std::string &cls, const std::string &instanceId);
-
-    std::unique_ptr<Broker> broker;
-    std::string hostName;
+    static ObjectPath identityPath(const std::string &cls, const std::string &instanceId) {
+        return ObjectPath{"", kNs, cls, {{"InstanceID", CimValue::makeString(instanceId)}}};
+    }
 };
 
-// "Name" -> the MOF literal of each property, and the CMPI type of each.
-std::map<std::string, std::string> literals(const Instance &instance);
-std::map<std::string, CMPIType> types(const Instance &instance);
-
 // Two adapters: nic0 (link up, 1000 Mb/s, MAC 02:1b:21:0a:0b:0c, driver
-// netdrv 1.2.3) and nic1 (link down).
-std::string twoAdapterProfile(const std::string &faults = "");
+// netdrv 1.2.3, a firmware version wider than its record field) and nic1
+// (link down).
+inline std::string twoAdapterProfile(const std::string &faults = "") {
+    return R"({"hostType": "Corlai", "adapters": [
+        {"name": "nic0", "driverName": "netdrv", "driverVersion": "1.2.3",
+         "firmwareVersion": "fw-9.0.0-with-a-text-wider-than-its-field",
+         "interfaceName": "vmk-nic0", "capabilities": "0x800", "enabledCapabilities": "0x0",
+         "pciBus": 16, "pciSlot": 2, "pciFunction": 1, "pciVendorId": "0x15", "pciDeviceId": "0x10fb",
+         "linkUp": true, "speedMbps": 1000, "fullDuplex": true, "mac": "02:1b:21:0a:0b:0c", "mtu": 9000},
+        {"name": "nic1", "driverName": "tg3", "driverVersion": "3.1", "firmwareVersion": "bc 5",
+         "linkUp": false, "mac": "d0:94:66:1a:2b:3d", "mtu": 1500}
+    ], "faults": [)" + faults + "]}";
+}
 
 // The path a reference property holds, as text; empty when it holds none.
-std::string referenceText(const Instance &instance, const char *property);
-
-std::vector<std::string> pathTexts(const std::vector<ObjectPath> &paths);
-std::vector<std::string> pathTexts(const std::vector<Instance> &instances);
+inline std::string referenceText(const Instance &instance, const char *property) {
+    const CimValue *value = instance.property(property);
+    return value != nullptr && value->reference ? formatPath(*value->reference) : std::string();
+}
 
 }  // namespace ethernettest

@@ -12,9 +12,8 @@
 #include <cerrno>
 #include <cstdlib>
 #include <cstring>
-#include <string>
-#include <functional>
 #include <iostream>
+#include <string>
 #include <thread>
 #include <vector>
 
@@ -31,8 +30,7 @@ constexpr const char *kVeth = "tvxveth0";
 
 struct Outcome {
     std::string skipped;
-    bool kernelAnswered = false;
-    int requestErrno = 0;
+    int requestErrno = 0;  // of the test's own request, 0 when the kernel answered it
     ethtool_cmd reported{};
     std::vector<PnicDetails> pnics;
     unsigned int result = 1;
@@ -56,8 +54,7 @@ void inPrivateNamespace(Outcome &outcome) {
     std::strncpy(request.ifr_name, kVeth, IFNAMSIZ - 1);
     outcome.reported.cmd = ETHTOOL_GSET;
     request.ifr_data = reinterpret_cast<char *>(&outcome.reported);
-    outcome.kernelAnswered = fd >= 0 && ::ioctl(fd, SIOCETHTOOL, &request) == 0;
-    outcome.requestErrno = errno;
+    outcome.requestErrno = fd >= 0 && ::ioctl(fd, SIOCETHTOOL, &request) == 0 ? 0 : errno;
     if (fd >= 0) ::close(fd);
     outcome.result = getPnicDetails(outcome.pnics);
 }
@@ -70,13 +67,13 @@ TEST(ServiceConsoleEthtool, RealVethReportsItsLinkSettings) {
     ASSERT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
 
     Outcome outcome;
-    std::thread(inPrivateNamespace, std::ref(outcome)).join();
+    std::thread([&outcome] { inPrivateNamespace(outcome); }).join();
     HostSim_ResetProfile();
     if (!outcome.skipped.empty()) GTEST_SKIP() << outcome.skipped;
 
     // qemu-user passes the request on untranslated for a 32-bit process, so
     // under emulation the kernel cannot be asked at all.
-    if (!outcome.kernelAnswered) {
+    if (outcome.requestErrno != 0) {
         GTEST_SKIP() << "ETHTOOL_GSET cannot be issued from this process ("
                      << std::strerror(outcome.requestErrno) << "); an emulated 32-bit run cannot ask the kernel";
     }

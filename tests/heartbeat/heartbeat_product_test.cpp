@@ -4,8 +4,6 @@
 // the broker.
 #include <gtest/gtest.h>
 
-#include <unistd.h>
-
 #include <functional>
 
 #include "EventSink.h"
@@ -14,7 +12,6 @@
 namespace {
 
 using namespace tvxbroker;
-using brokertest::Delivery;
 using brokertest::EventSink;
 
 constexpr const char *kNs = "root/cimv2";
@@ -39,12 +36,7 @@ TEST(HeartbeatProduct, BeatsOnceLoadedAndAcceptsWhatSfcbAsksUntilShutdown) {
         EXPECT_TRUE(response.ok()) << response.rc << " " << response.message.value_or("");
     }
     ASSERT_TRUE(sink.waitFor(1));
-    const Delivery first = sink.received().front();
-    EXPECT_EQ(first.event.path.className, kHeartbeat);
-    char host[256] = {};
-    gethostname(host, sizeof host - 1);
-    ASSERT_NE(first.event.property("hostname"), nullptr);
-    EXPECT_EQ(first.event.property("hostname")->text, host);
+    EXPECT_EQ(sink.received().front().event.path.className, kHeartbeat);
 
     auto *mi = static_cast<CMPIIndicationMI *>(broker.managementInterface(kHeartbeat, InterfaceKind::Indication));
     ASSERT_NE(mi, nullptr);

@@ -10,10 +10,7 @@ namespace {
 void walkAdapters() {
     char area[21];
     if (PRB_CheckSig(area, sizeof area, nullptr) != 0) return;
-    const List names = instanceList(70);
-    for (int i = 0; i < PRB_ParamListUsedCount(names.get()); ++i) {
-        char *name = nullptr;
-        if (PRB_ParamListGetString(names.get(), i, &name) != 0) continue;
+    for (const std::string &name : servedAdapterNames()) {
         Bytes mtu(4), record(1252);
         readNode(74, {name}, mtu);
         readNode(72, {name}, record);

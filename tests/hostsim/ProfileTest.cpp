@@ -11,12 +11,14 @@ namespace {
 
 using ::testing::StartsWith;
 
-std::string withAdapter(const char *adapterJson) {
-    return std::string(R"({"hostType": "Corlai", "adapters": [)") + adapterJson + "]}";
+// A "Corlai" host with one section given as JSON text.
+std::string with(const char *section, const std::string &json) {
+    return std::string(R"({"hostType": "Corlai", ")") + section + "\": " + json + "}";
 }
-
-std::string withFault(const char *faultJson) {
-    return std::string(R"({"hostType": "Corlai", "faults": [)") + faultJson + "]}";
+std::string withAdapter(const char *adapterJson) { return with("adapters", std::string("[") + adapterJson + "]"); }
+std::string withFault(const char *faultJson) { return with("faults", std::string("[") + faultJson + "]"); }
+std::string withCores(const char *coresJson) {
+    return with("processors", std::string(R"({"packages": [{}, {"cores": [)") + coresJson + "]}]}");
 }
 
 class HostSimProfiles : public HostSimTest {};
@@ -41,6 +43,17 @@ TEST_F(HostSimProfiles, GarbledProfilesAreRefusedNamingTheField) {
         {withFault(R"({"call": "PRB_Get", "noList": true})"), "faults[0].noList: unknown field"},
         {withFault(R"({"call": "PRB_Get", "instance": {}})"), "faults[0].instance: expected a text or an integer"},
         {withFault(R"({"call": "PRB_CheckSig", "nth": 0})"), "faults[0].nth: expected an integer from 1 to"},
+        {with("processors", "[]"), "processors: expected an object, got an array"},
+        {with("processors", R"({"packages": [{"cpuid": {"vendor": "GenuineIntelX"}}]})"),
+         "processors.packages[0].cpuid.vendor: expected a text of at most 12 bytes"},
+        {with("processors", R"({"packages": [{"instance": 1}, {}]})"),
+         "processors.packages[1].instance: duplicate package instance 1"},
+        {withCores(R"({"state": 256})"), "processors.packages[1].cores[0].state: expected true, false or an integer"},
+        {withCores(R"({"instance": 5, "count": 2})"),
+         "processors.packages[1].cores[0].instance: cannot be given with a \"count\" above 1"},
+        {withCores(R"({"instance": 2147483648})"),
+         "processors.packages[1].cores[0].instance: expected an integer from -2147483648 to 2147483647"},
+        {withCores(R"({"count": 100000}, {})"), "processors: more than 100000 cores"},
     };
     serve(host({{{"name", "kept"}}}));
     for (const auto &[json, message] : cases) EXPECT_THAT(loadError(json), StartsWith(message)) << json;
@@ -71,16 +84,6 @@ TEST_F(HostSimProfiles, FilesAreServedOrRefusedWithTheirPath) {
     EXPECT_EQ(servedAdapterNames(), std::vector<std::string>{"from-file"});
     for (const auto &example : std::filesystem::directory_iterator(HOSTSIM_PROFILE_DIR)) {
         EXPECT_EQ(HostSim_CheckProfileFile(example.path().c_str(), error, sizeof error), 0) << error;
-    }
-}
-
-TEST_F(HostSimProfiles, HostTypeDecidesTheServiceConsole) {
-    for (const auto &[hostType, inCosFlag, osIsOsk] : {std::tuple{"Corlai", 0, 1}, std::tuple{"Corla", 1, 0}}) {
-        serve({{"hostType", hostType}});
-        int inCos = -1;
-        EXPECT_EQ(OskuserCompat_InCOS(&inCos), 0);
-        EXPECT_EQ(inCos, inCosFlag) << hostType;
-        EXPECT_EQ(HostType_OSIsOSK(), osIsOsk) << hostType;
     }
 }
 

@@ -5,170 +5,165 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <functional>
+#include <array>
 #include <string>
 #include <vector>
 
-#include "OmcTestBroker.h"
+#include "core/Broker.h"
 #include "model/PathText.h"
 
 namespace {
 
 using namespace tvxbroker;
 
-ObjectPath object(const char *className, const char *name, const char *ns = "root/cimv2") {
+ObjectPath object(const char *className, const std::string &name, const char *ns = "root/cimv2") {
     const char *key = std::string(className) == "Test_System" ? "Name" : "DeviceID";
     return ObjectPath{"", ns, className, {{key, CimValue::makeString(name)}}};
 }
 
-ObjectPath system(const char *name) { return object("Test_System", name); }
+ObjectPath system(const std::string &name) { return object("Test_System", name); }
 
 // A reference name: the association keyed by its references as the provider set them.
-ObjectPath link(const char *assocClass, const char *system, const char *deviceClass, const char *device) {
+ObjectPath link(const char *assocClass, const std::string &system, const char *deviceClass, const char *device) {
     return ObjectPath{"", "root/cimv2", assocClass,
                       {{"Antecedent", CimValue::makeReference(object("Test_System", system, ""))},
                        {"Dependent", CimValue::makeReference(object(deviceClass, device, ""))}}};
 }
 
-std::vector<std::string> texts(const std::vector<ObjectPath> &paths) {
+// Sorted, since the order of the answers is the provider's.
+std::vector<std::string> texts(const std::vector<ObjectPath> &paths, const std::vector<Instance> &instances = {}) {
     std::vector<std::string> result;
     for (const ObjectPath &path : paths) result.push_back(formatPath(path));
+    for (const Instance &instance : instances) result.push_back(formatPath(instance.path));
     std::sort(result.begin(), result.end());
     return result;
 }
 
-std::vector<std::string> texts(const std::vector<Instance> &instances) {
-    std::vector<ObjectPath> paths;
-    for (const Instance &instance : instances) paths.push_back(instance.path);
-    return texts(paths);
-}
+enum Operation { associators, associatorNames, references, referenceNames };
+
+// The association class, result class, role and result role of a request;
+// the reference operations take the first and the third only.
+using Filters = std::array<const char *, 4>;
 
 class SimpleAssociation : public testing::Test {
 protected:
-    Broker broker{omctest::omcTestConfig()};
+    Response request(Operation operation, const ObjectPath &source, const Filters &f,
+                     const PropertyList &properties = std::nullopt) {
+        if (operation == associators) return broker.associators(source, f[0], f[1], f[2], f[3], properties);
+        if (operation == associatorNames) return broker.associatorNames(source, f[0], f[1], f[2], f[3]);
+        if (operation == references) return broker.references(source, f[0], f[2], properties);
+        return broker.referenceNames(source, f[0], f[2]);
+    }
+
+    Broker broker{loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, TVX_OMCTESTPROVIDER_REG, {TVX_OMCTESTPROVIDER_MOF})};
 };
 
-TEST_F(SimpleAssociation, AssociatorNamesFollowEveryFilter) {
-    const std::vector<ObjectPath> fromAlpha = {object("Test_Disk", "disk0"), object("Test_Device", "nic0"),
-                                               object("Test_Disk", "ghost"), object("Test_Disk", "disk1")};
-    const std::vector<ObjectPath> fromDisk0 = {system("alpha"), system("beta")};
-    struct Case {
-        ObjectPath source;
-        const char *assocClass, *resultClass, *role, *resultRole;
-        std::vector<ObjectPath> farEnds;
-    };
-    const Case cases[] = {
-        {system("alpha"), "", "", "", "", fromAlpha},
-        {system("alpha"), "Test_SystemDevice", "", "", "", fromAlpha},
-        {system("alpha"), "Test_SpareDevice", "", "", "", {object("Test_Disk", "disk1")}},
-        {system("alpha"), "", "Test_Disk", "", "", {fromAlpha[0], fromAlpha[2], fromAlpha[3]}},
-        {system("alpha"), "", "Test_System", "", "", {}},
-        {system("alpha"), "", "", "antecedent", "DEPENDENT", fromAlpha},
-        {system("alpha"), "", "", "Dependent", "", {}},
-        {system("alpha"), "", "", "", "Antecedent", {}},
-        {ObjectPath{"", "root/cimv2", "TEST_SYSTEM", {{"name", CimValue::makeString("alpha")}}}, "", "", "", "",
-         fromAlpha},
-        {object("Test_Disk", "disk0"), "", "", "Dependent", "Antecedent", fromDisk0},
-        {object("Test_Device", "disk0"), "", "", "", "", fromDisk0},
-        {object("Test_Disk", "disk0"), "", "", "Antecedent", "", {}},
-        {system("lonely"), "", "", "", "", {}},
-    };
-    for (const Case &c : cases) {
-        SCOPED_TRACE(formatPath(c.source) + " " + c.assocClass + " " + c.resultClass + " " + c.role +
-                     " " + c.resultRole);
-        const Response names = broker.associatorNames(c.source, c.assocClass, c.resultClass, c.role, c.resultRole);
-        ASSERT_TRUE(names.ok()) << names.message.value_or("");
-        EXPECT_EQ(texts(names.paths), texts(c.farEnds));
-        EXPECT_TRUE(names.done);
-    }
-}
-
-TEST_F(SimpleAssociation, AssociatorsFetchFarEndsWithThePropertyListAndSkipMissingOnes) {
-    const Response all = broker.associators(system("alpha"), "", "", "", "", PropertyList{{"Size"}});
-    ASSERT_TRUE(all.ok()) << all.message.value_or("");
-    EXPECT_EQ(texts(all.instances),
-              texts({object("Test_Disk", "disk0"), object("Test_Device", "nic0"), object("Test_Disk", "disk1")}));
-    for (const Instance &device : all.instances) {
-        EXPECT_NE(device.property("Size"), nullptr);
-        EXPECT_EQ(device.property("Model"), nullptr);
-    }
-    const Response disks = broker.associators(system("alpha"), "", "Test_Disk", "", "", std::nullopt);
-    ASSERT_TRUE(disks.ok()) << disks.message.value_or("");
-    EXPECT_EQ(texts(disks.instances), texts({object("Test_Disk", "disk0"), object("Test_Disk", "disk1")}));
-    ASSERT_FALSE(disks.instances.empty());
-    EXPECT_NE(disks.instances[0].property("Model"), nullptr);
-}
-
-TEST_F(SimpleAssociation, ReferencesAndTheirNamesAgreeUnderEveryFilter) {
+TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {
+    const ObjectPath alpha = system("alpha");
+    const ObjectPath disk0 = object("Test_Disk", "disk0");
+    const ObjectPath disk1 = object("Test_Disk", "disk1");
+    const ObjectPath ghost = object("Test_Disk", "ghost");  // linked to, but not served
+    const std::vector<ObjectPath> fromAlpha = {disk0, object("Test_Device", "nic0"), ghost, disk1};
     const std::vector<ObjectPath> ofAlpha = {link("Test_HostedDevice", "alpha", "Test_Disk", "disk0"),
                                              link("Test_HostedDevice", "alpha", "Test_Device", "nic0"),
                                              link("Test_HostedDevice", "alpha", "Test_Disk", "ghost"),
                                              link("Test_SpareDevice", "alpha", "Test_Disk", "disk1")};
+    const std::vector<Operation> referencing = {references, referenceNames};
+    // The provider links this device to a system named after the filters it was given.
+    const ObjectPath echo = object("Test_Device", "echo");
+    const Filters echoed = {"Test_HostedDevice", "Test_System", "Dependent", "Antecedent"};
     struct Case {
+        std::vector<Operation> operations;
         ObjectPath source;
-        const char *resultClass, *role;
-        std::vector<ObjectPath> names;
+        Filters filters;
+        std::vector<ObjectPath> answers;
     };
     const Case cases[] = {
-        {system("alpha"), "", "", ofAlpha},
-        {system("alpha"), "Test_SystemDevice", "ANTECEDENT", ofAlpha},
-        {system("alpha"), "Test_SpareDevice", "", {ofAlpha[3]}},
-        {system("alpha"), "", "Dependent", {}},
-        {object("Test_Disk", "disk0"), "", "Dependent",
+        {{associatorNames}, alpha, {"", "", "", ""}, fromAlpha},
+        {{associatorNames}, alpha, {"Test_SystemDevice", "", "", ""}, fromAlpha},
+        {{associatorNames}, alpha, {"Test_SpareDevice", "", "", ""}, {disk1}},
+        {{associatorNames}, alpha, {"", "Test_Disk", "", ""}, {disk0, ghost, disk1}},
+        {{associators}, alpha, {"", "Test_Disk", "", ""}, {disk0, disk1}},
+        {{associatorNames}, alpha, {"", "Test_System", "", ""}, {}},
+        {{associatorNames}, alpha, {"", "", "antecedent", "DEPENDENT"}, fromAlpha},
+        {{associatorNames}, alpha, {"", "", "Dependent", ""}, {}},
+        {{associatorNames}, alpha, {"", "", "", "Antecedent"}, {}},
+        {{associatorNames}, ObjectPath{"", "root/cimv2", "TEST_SYSTEM", {{"name", CimValue::makeString("alpha")}}},
+         {"", "", "", ""}, fromAlpha},
+        {{associatorNames}, disk0, {"", "", "Dependent", "Antecedent"}, {alpha, system("beta")}},
+        {{associatorNames}, object("Test_Device", "disk0"), {"", "", "", ""}, {alpha, system("beta")}},
+        {{associatorNames}, disk0, {"", "", "Antecedent", ""}, {}},
+        {referencing, alpha, {"", "", "", ""}, ofAlpha},
+        {referencing, alpha, {"Test_SystemDevice", "", "ANTECEDENT", ""}, ofAlpha},
+        {referencing, alpha, {"Test_SpareDevice", "", "", ""}, {ofAlpha[3]}},
+        {referencing, alpha, {"", "", "Dependent", ""}, {}},
+        {referencing, disk0, {"", "", "Dependent", ""},
          {ofAlpha[0], link("Test_HostedDevice", "beta", "Test_Disk", "disk0")}},
+        {{associators, associatorNames}, echo, echoed, {system("Test_HostedDevice Test_System Dependent Antecedent")}},
+        // The reference operations pass their result class as the association class.
+        {referencing, echo, echoed,
+         {link("Test_HostedDevice", "Test_HostedDevice (null) Dependent (null)", "Test_Device", "echo")}},
     };
     for (const Case &c : cases) {
-        SCOPED_TRACE(formatPath(c.source) + " " + c.resultClass + " " + c.role);
-        const Response names = broker.referenceNames(c.source, c.resultClass, c.role);
-        const Response instances = broker.references(c.source, c.resultClass, c.role, std::nullopt);
-        ASSERT_TRUE(names.ok() && instances.ok());
-        EXPECT_EQ(texts(names.paths), texts(c.names));
-        EXPECT_EQ(texts(instances.instances), texts(c.names));
-        for (const Instance &association : instances.instances) {
-            // The provider reuses one instance for all its answers: each
-            // answer must still be the one it was when returned.
-            const CimValue *note = association.property("Note");
-            ASSERT_NE(note, nullptr);
-            EXPECT_EQ(note->text, association.property("Dependent")->reference->keys.at(0).value.text);
+        for (const Operation operation : c.operations) {
+            const Filters &f = c.filters;
+            SCOPED_TRACE(testing::Message() << "operation " << operation << " from " << formatPath(c.source) << ": "
+                                            << f[0] << "|" << f[1] << "|" << f[2] << "|" << f[3]);
+            const Response response = request(operation, c.source, f);
+            ASSERT_TRUE(response.ok()) << response.message.value_or("");
+            EXPECT_TRUE(response.done);
+            EXPECT_EQ(texts(response.paths, response.instances), texts(c.answers));
         }
     }
 }
 
-TEST_F(SimpleAssociation, ReferencesKeepTheListedPropertiesAndTheReferences) {
-    const std::vector<std::string> all = {"Antecedent", "Dependent", "Note"};
-    const std::pair<PropertyList, std::vector<std::string>> cases[] = {
-        {std::nullopt, all},
-        {PropertyList{{"note"}}, all},
-        {PropertyList{std::vector<std::string>{}}, {"Antecedent", "Dependent"}},
+TEST_F(SimpleAssociation, AnswersKeepTheListedPropertiesTheKeysAndTheReferences) {
+    const std::vector<std::string> association = {"Antecedent", "Dependent", "Note"};
+    const struct {
+        Operation operation;
+        PropertyList properties;
+        std::vector<std::string> kept;
+    } cases[] = {
+        {associators, std::nullopt, {"DeviceID", "Model", "Size"}},
+        {associators, PropertyList{{"Size"}}, {"DeviceID", "Size"}},
+        {references, std::nullopt, association},
+        {references, PropertyList{{"note"}}, association},
+        {references, PropertyList{std::vector<std::string>{}}, {"Antecedent", "Dependent"}},
     };
-    for (const auto &[properties, kept] : cases) {
-        const Response response = broker.references(system("alpha"), "", "", properties);
-        ASSERT_EQ(response.instances.size(), 4U) << response.message.value_or("");
-        for (const Instance &association : response.instances) {
+    for (const auto &c : cases) {
+        const Response response = request(c.operation, system("alpha"), {"", "", "", ""}, c.properties);
+        ASSERT_EQ(response.instances.size(), c.operation == associators ? 3U : 4U) << response.message.value_or("");
+        for (const Instance &answer : response.instances) {
             std::vector<std::string> names;
-            for (const NamedValue &property : association.properties) names.push_back(property.name);
-            EXPECT_THAT(names, testing::UnorderedElementsAreArray(kept));
+            for (const NamedValue &property : answer.properties) names.push_back(property.name);
+            EXPECT_THAT(names, testing::UnorderedElementsAreArray(c.kept)) << formatPath(answer.path);
+            // The provider reuses one instance for all its answers: each
+            // answer must still be the one it was when returned.
+            if (const CimValue *note = answer.property("Note")) {
+                EXPECT_EQ(note->text, answer.path.key("Dependent")->reference->keys.at(0).value.text);
+            }
         }
     }
 }
 
 TEST_F(SimpleAssociation, EveryOperationAnswersNothingForALonelySourceAndOnlyTheStatusOnFailure) {
-    const std::function<Response(const ObjectPath &)> operations[] = {
-        [&](const ObjectPath &source) { return broker.associators(source, "", "", "", "", std::nullopt); },
-        [&](const ObjectPath &source) { return broker.associatorNames(source, "", "", "", ""); },
-        [&](const ObjectPath &source) { return broker.references(source, "", "", std::nullopt); },
-        [&](const ObjectPath &source) { return broker.referenceNames(source, "", ""); },
+    const struct {
+        const char *system;
+        CMPIrc rc;
+        const char *message;
+    } sources[] = {
+        {"lonely", CMPI_RC_OK, ""},
+        {"broken", CMPI_RC_ERR_FAILED, "broken system"},
+        {"confused", CMPI_RC_ERR_FAILED, "doReferences returned something other than an association instance"},
     };
-    for (const auto &operation : operations) {
-        const Response lonely = operation(system("lonely"));
-        EXPECT_TRUE(lonely.ok() && lonely.done);
-        EXPECT_TRUE(lonely.instances.empty() && lonely.paths.empty());
-
-        const Response broken = operation(system("broken"));
-        EXPECT_EQ(broken.rc, CMPI_RC_ERR_FAILED);
-        EXPECT_EQ(broken.message.value_or(""), "broken system");
-        EXPECT_FALSE(broken.done);
-        EXPECT_TRUE(broken.instances.empty() && broken.paths.empty());
+    for (const Operation operation : {associators, associatorNames, references, referenceNames}) {
+        for (const auto &source : sources) {
+            const Response response = request(operation, system(source.system), {"", "", "", ""});
+            EXPECT_EQ(response.rc, source.rc) << source.system;
+            EXPECT_EQ(response.message.value_or(""), source.message);
+            EXPECT_EQ(response.done, source.rc == CMPI_RC_OK) << source.system;
+            EXPECT_TRUE(response.instances.empty() && response.paths.empty()) << source.system;
+        }
     }
 }
 

@@ -2,22 +2,12 @@
 // paths and their order, the values clients read (arrays that keep their
 // holes, the brand text), how getInstance reads DeviceID, and the answers
 // for another class and for a failing inventory.
-#include <unistd.h>
-
-#include <memory>
-#include <string>
-#include <vector>
-
-#include <gtest/gtest.h>
-
-#include "core/Broker.h"
-#include "hostsim/HostSimControl.h"
+#include "ProductBroker.h"
 
 namespace {
 
-using namespace tvxbroker;
+using namespace producttest;
 
-constexpr const char *kNs = "root/cimv2";
 constexpr const char *kClass = "Talvex_Processor";
 constexpr const char *kUnserved = "Test_UnservedProcessor";
 
@@ -34,129 +24,71 @@ std::string twoPackageHost(const std::string &policy, bool threads, const std::s
          "cores": [{"state": 1}]}]}})";
 }
 
-class ProcessorProvider : public testing::Test {
+class ProcessorProvider : public ProductBroker {
 protected:
-    void SetUp() override {
-        BrokerConfig config =
-            loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
-        for (const ProviderRegistration &registration : std::vector<ProviderRegistration>(config.registrations)) {
-            if (registration.className != kClass) continue;
-            ProviderRegistration unserved = registration;
-            unserved.className = kUnserved;
-            config.registrations.push_back(unserved);
-        }
-        broker = std::make_unique<Broker>(std::move(config));
-    }
+    ProcessorProvider() : ProductBroker(kClass, kUnserved) {}
 
-    void TearDown() override {
-        EXPECT_EQ(broker->liveObjectCount(), 0u);
-        broker->shutdown();
-        EXPECT_EQ(HostSim_LiveListCount(), 0u) << "a system-information list was not freed";
-        HostSim_ResetProfile();
-    }
-
-    static void serve(const std::string &profile) {
-        char error[256];
-        ASSERT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
-    }
-
-    static ObjectPath path(const std::string &cls, const std::string &deviceId) {
-        return ObjectPath{"", kNs, cls, {{"DeviceID", CimValue::makeString(deviceId)}}};
-    }
-
-    std::vector<Instance> enumerate() const {
-        const Response response = broker->enumInstances(ObjectPath{"", kNs, kClass, {}}, {});
+    // The MOF literals of each instance, in package order.
+    std::vector<std::map<std::string, std::string>> enumerate() const {
+        const Response response = broker->enumInstances(classPath(kClass), {});
         EXPECT_TRUE(response.ok()) << response.rc;
-        return response.instances;
+        std::vector<std::map<std::string, std::string>> shown;
+        for (const Instance &instance : response.instances) shown.push_back(literals(instance));
+        return shown;
     }
-
-    std::unique_ptr<Broker> broker;
 };
-
-// Array elements as text, "null" for a hole.
-std::vector<std::string> elements(const Instance &instance, const char *property) {
-    std::vector<std::string> shown;
-    const CimValue *value = instance.property(property);
-    if (value == nullptr) return {"absent"};
-    for (const CimValue &element : value->elements) {
-        if (element.null) {
-            shown.push_back("null");
-        } else if (element.type == CMPI_string) {
-            shown.push_back(element.text);
-        } else {
-            shown.push_back(std::to_string(element.unsignedValue));
-        }
-    }
-    return shown;
-}
-
-using Texts = std::vector<std::string>;
 
 TEST_F(ProcessorProvider, PathsCarryTheFiveKeysInPackageOrder) {
     serve(twoPackageHost("static", false));
-    const Response names = broker->enumInstanceNames(ObjectPath{"", kNs, kClass, {}});
+    const Response names = broker->enumInstanceNames(classPath(kClass));
     ASSERT_TRUE(names.ok());
-    ASSERT_EQ(names.paths.size(), 2u);
-    char host[256] = {};
-    ::gethostname(host, sizeof host - 1);
-    const char *expectedKeys[] = {"SystemCreationClassName", "SystemName", "CreationClassName",
-                                  "DeviceID", "ElementName"};
-    for (std::size_t i = 0; i < 2; ++i) {
-        const ObjectPath &name = names.paths[i];
-        ASSERT_EQ(name.keys.size(), 5u);
-        for (std::size_t k = 0; k < 5; ++k) EXPECT_EQ(name.keys[k].name, expectedKeys[k]);
-        EXPECT_EQ(name.key("SystemName")->text, host);
-        EXPECT_EQ(name.key("CreationClassName")->text, kClass);
-        EXPECT_EQ(name.key("DeviceID")->text, "cpu-" + std::to_string(i));
-        EXPECT_EQ(name.key("ElementName")->text, "cpu-" + std::to_string(i));
+    std::vector<std::string> expected;
+    for (const std::string id : {"cpu-0", "cpu-1"}) {
+        expected.push_back("root/cimv2:Talvex_Processor.SystemCreationClassName=\"OMC_UnitaryComputerSystem\","
+                           "SystemName=\"" + hostName + "\",CreationClassName=\"Talvex_Processor\","
+                           "DeviceID=\"" + id + "\",ElementName=\"" + id + "\"");
     }
+    EXPECT_EQ(pathTexts(names), expected);
 }
 
 TEST_F(ProcessorProvider, CharacteristicsKeepFiveElementsWithHolesForAbsentFeatures) {
     const struct {
         const char *policy;
         bool threads;
-        Texts intel, intelEnabled, amd, amdEnabled;
+        const char *intel, *intelEnabled, *amd, *amdEnabled;
     } cases[] = {
-        {"off", false,
-         {"2", "null", "null", "6", "null"}, {"2", "null", "null", "2", "null"},
-         {"2", "4", "null", "6", "null"}, {"2", "2", "null", "2", "null"}},
-        {"static", true,
-         {"2", "null", "5", "6", "7"}, {"2", "null", "2", "2", "3"},
-         {"2", "4", "5", "6", "7"}, {"2", "2", "2", "2", "3"}},
-        {"dynamic", false,
-         {"2", "null", "null", "6", "7"}, {"2", "null", "null", "2", "2"},
-         {"2", "4", "null", "6", "7"}, {"2", "2", "null", "2", "2"}},
+        {"off", false, "{2, NULL, NULL, 6, NULL}", "{2, NULL, NULL, 2, NULL}",
+         "{2, 4, NULL, 6, NULL}", "{2, 2, NULL, 2, NULL}"},
+        {"static", true, "{2, NULL, 5, 6, 7}", "{2, NULL, 2, 2, 3}", "{2, 4, 5, 6, 7}", "{2, 2, 2, 2, 3}"},
+        {"dynamic", false, "{2, NULL, NULL, 6, 7}", "{2, NULL, NULL, 2, 2}",
+         "{2, 4, NULL, 6, 7}", "{2, 2, NULL, 2, 2}"},
     };
     for (const auto &c : cases) {
         serve(twoPackageHost(c.policy, c.threads));
-        const std::vector<Instance> instances = enumerate();
+        const auto instances = enumerate();
         ASSERT_EQ(instances.size(), 2u);
-        EXPECT_EQ(elements(instances[0], "Characteristics"), c.intel) << c.policy;
-        EXPECT_EQ(elements(instances[0], "EnabledProcessorCharacteristics"), c.intelEnabled) << c.policy;
-        EXPECT_EQ(elements(instances[1], "Characteristics"), c.amd) << c.policy;
-        EXPECT_EQ(elements(instances[1], "EnabledProcessorCharacteristics"), c.amdEnabled) << c.policy;
+        EXPECT_EQ(instances[0].at("Characteristics"), c.intel) << c.policy;
+        EXPECT_EQ(instances[0].at("EnabledProcessorCharacteristics"), c.intelEnabled) << c.policy;
+        EXPECT_EQ(instances[1].at("Characteristics"), c.amd) << c.policy;
+        EXPECT_EQ(instances[1].at("EnabledProcessorCharacteristics"), c.amdEnabled) << c.policy;
     }
 }
 
 TEST_F(ProcessorProvider, ScalarsAndTheBrandTextAsClientsReadThem) {
     serve(twoPackageHost("static", false));
-    const std::vector<Instance> instances = enumerate();
-    ASSERT_EQ(instances.size(), 2u);
-    const Instance &intel = instances[0];
-    const Instance &amd = instances[1];
-    EXPECT_EQ(elements(intel, "OtherIdentifyingInfo"), Texts{"0x   0"});
-    EXPECT_EQ(elements(amd, "OtherIdentifyingInfo"), Texts{"0x  1f"});
-    EXPECT_EQ(elements(amd, "IdentifyingDescriptions"), Texts{"Brand ID"});
-    EXPECT_EQ(elements(amd, "OperationalStatus"), Texts{"2"});
-    EXPECT_EQ(intel.property("Vendor")->unsignedValue, 2u);
-    EXPECT_EQ(amd.property("Vendor")->unsignedValue, 3u);
-    EXPECT_EQ(intel.property("Vendor")->type, CMPI_uint16);
-    EXPECT_EQ(intel.property("NumberOfEnabledCores")->unsignedValue, 2u);
-    EXPECT_EQ(intel.property("CPUStatus")->unsignedValue, 4u);
-    EXPECT_EQ(amd.property("CPUStatus")->unsignedValue, 1u);
-    EXPECT_EQ(amd.property("Stepping")->text, "12");
-    EXPECT_EQ(amd.property("ModelName")->text, "Model   ");
+    const Response response = broker->enumInstances(classPath(kClass), {});
+    ASSERT_EQ(response.instances.size(), 2u);
+    EXPECT_EQ(response.instances[0].property("Vendor")->type, CMPI_uint16);
+    const auto intel = literals(response.instances[0]);
+    const auto amd = literals(response.instances[1]);
+    EXPECT_EQ(intel.at("OtherIdentifyingInfo"), "{\"0x   0\"}");
+    EXPECT_EQ(amd.at("OtherIdentifyingInfo"), "{\"0x  1f\"}");
+    EXPECT_EQ(amd.at("IdentifyingDescriptions"), "{\"Brand ID\"}");
+    EXPECT_EQ(intel.at("CPUStatus"), "4");
+    EXPECT_EQ(amd.at("CPUStatus"), "1");
+    EXPECT_EQ(intel.at("NumberOfEnabledCores"), "2");
+    EXPECT_EQ(amd.at("Stepping"), "\"12\"");
+    EXPECT_EQ(amd.at("ModelName"), "\"Model   \"");
 }
 
 TEST_F(ProcessorProvider, GetInstanceReadsTheNumberAfterTheLastHyphen) {
@@ -182,7 +114,8 @@ TEST_F(ProcessorProvider, GetInstanceReadsTheNumberAfterTheLastHyphen) {
         {kUnserved, "cpu-0", CMPI_RC_OK, nullptr},
     };
     for (const auto &c : cases) {
-        const Response response = broker->getInstance(path(c.cls, c.deviceId), {});
+        const ObjectPath path{"", kNs, c.cls, {{"DeviceID", CimValue::makeString(c.deviceId)}}};
+        const Response response = broker->getInstance(path, {});
         EXPECT_EQ(response.rc, c.rc) << c.cls << " " << c.deviceId;
         ASSERT_EQ(response.instances.size(), c.found ? 1u : 0u) << c.cls << " " << c.deviceId;
         if (c.found) {
@@ -192,16 +125,17 @@ TEST_F(ProcessorProvider, GetInstanceReadsTheNumberAfterTheLastHyphen) {
 }
 
 TEST_F(ProcessorProvider, AFailingInventoryIsAnEmptyEnumerationAndNotFound) {
+    const ObjectPath cpu0{"", kNs, kClass, {{"DeviceID", CimValue::makeString("cpu-0")}}};
     for (const char *fault : {R"({"call": "PRB_CheckSig"})", R"({"call": "PRB_Get", "node": 607})"}) {
         serve(twoPackageHost("static", false, fault));
         EXPECT_TRUE(enumerate().empty()) << fault;
-        const Response names = broker->enumInstanceNames(ObjectPath{"", kNs, kClass, {}});
+        const Response names = broker->enumInstanceNames(classPath(kClass));
         EXPECT_TRUE(names.ok());
         EXPECT_TRUE(names.paths.empty());
-        EXPECT_EQ(broker->getInstance(path(kClass, "cpu-0"), {}).rc, CMPI_RC_ERR_NOT_FOUND) << fault;
+        EXPECT_EQ(broker->getInstance(cpu0, {}).rc, CMPI_RC_ERR_NOT_FOUND) << fault;
     }
     serve(twoPackageHost("static", false));
-    const Response other = broker->enumInstances(ObjectPath{"", kNs, kUnserved, {}}, {});
+    const Response other = broker->enumInstances(classPath(kUnserved), {});
     EXPECT_TRUE(other.ok());
     EXPECT_TRUE(other.instances.empty());
 }

@@ -13,7 +13,7 @@ using namespace testprovider;
 class GadgetProvider : public InstanceProvider {
 public:
     GadgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx, ProviderClass::Gadget) {}
+        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
 
     CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
                                  const CmpiObjectPath &cop) override {

@@ -1,65 +1,51 @@
-// Serves Test_ProviderStats: one instance per provider class of this library,
-// with its life counters and how many interfaces its base objects have handed
-// out, so tests can see how the broker's factory calls shared the objects.
+// Serves Test_ProviderStats: for the providers whose objects the broker tests
+// watch, how often those objects were initialized and how many interfaces
+// their base objects have handed out.
 #include <array>
 
 #include "CmpiProviderFactory.h"
 #include "TestProvider.h"
 
-extern CmpiProviderBase baseWidgetProvider;
-extern CmpiProviderBase baseGadgetProvider;
 extern CmpiProviderBase baseWidgetGadgetProvider;
 extern CmpiProviderBase baseEventProvider;
 extern CmpiProviderBase baseEventStore;
-extern CmpiProviderBase baseThrowingProvider;
-
-CMProviderBase(StatsProvider);
 
 namespace {
 
 using namespace testprovider;
 
-struct ClassRow {
+struct ProviderRow {
     const char *name;
-    ProviderClass cls;
     std::array<const CmpiProviderBase *, 2> bases;  // unused entries are null
 };
 
-const ClassRow kClasses[] = {
-    {"WidgetProvider", ProviderClass::Widget, {&baseWidgetProvider}},
-    {"GadgetProvider", ProviderClass::Gadget, {&baseGadgetProvider}},
-    {"WidgetGadgetProvider", ProviderClass::WidgetGadget, {&baseWidgetGadgetProvider}},
-    {"EventProvider", ProviderClass::Event, {&baseEventProvider, &baseEventStore}},
-    {"StatsProvider", ProviderClass::Stats, {&baseStatsProvider}},
-    {"ThrowingProvider", ProviderClass::Throwing, {&baseThrowingProvider}},
+const ProviderRow kProviders[] = {
+    {"WidgetGadgetProvider", {&baseWidgetGadgetProvider}},
+    {"EventProvider", {&baseEventProvider, &baseEventStore}},
 };
-
-CMPISint32 useCountOf(const ClassRow &row) {
-    CMPISint32 uses = 0;
-    for (const CmpiProviderBase *base : row.bases) {
-        if (base != nullptr) uses += base->getUseCount();
-    }
-    return uses;
-}
 
 class StatsProvider : public InstanceProvider {
 public:
-    StatsProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx, ProviderClass::Stats) {}
+    StatsProvider(const CmpiBroker &mb, const CmpiContext &ctx) : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
 
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
-        for (const ClassRow &row : kClasses) {
+        for (const ProviderRow &row : kProviders) {
+            CMPIUint32 initialized = 0;
+            CMPISint32 uses = 0;
+            for (const CmpiProviderBase *base : row.bases) {
+                if (base == nullptr) continue;
+                uses += base->getUseCount();
+                const auto *provider = dynamic_cast<const InstanceProvider *>(base->getBaseMI());
+                if (provider != nullptr) initialized += provider->initializations.load();
+            }
             CmpiObjectPath path(cop.getNameSpace(), "Test_ProviderStats");
             path.setKey("ProviderName", row.name);
             CmpiInstance stats(path);
             stats.setPropertyFilter(properties, nullptr);
-            const LifeCounts &life = lifeOf(row.cls);
             stats.setProperty("ProviderName", row.name);
-            stats.setProperty("Constructed", CMPIUint32(life.constructed.load()));
-            stats.setProperty("Initialized", CMPIUint32(life.initialized.load()));
-            stats.setProperty("Destroyed", CMPIUint32(life.destroyed.load()));
-            stats.setProperty("UseCount", useCountOf(row));
+            stats.setProperty("Initialized", initialized);
+            stats.setProperty("UseCount", uses);
             rslt.returnData(stats);
         }
         rslt.returnDone();
@@ -69,4 +55,5 @@ public:
 
 }  // namespace
 
+CMProviderBase(StatsProvider);
 CMInstanceMIFactory(StatsProvider, StatsProvider)

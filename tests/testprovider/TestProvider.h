@@ -1,11 +1,8 @@
 // What the test providers share: the names they serve, the rule that ties a
-// gadget to its widget, key reading, and the life counters StatsProvider
-// reports for every provider class of this library.
+// gadget to its widget, key reading, and the base of every instance provider.
 #pragma once
 
-#include <array>
 #include <atomic>
-#include <cstddef>
 #include <string>
 
 #include "CmpiResultFilters.h"
@@ -47,50 +44,25 @@ inline std::string widgetNameOf(const std::string &gadgetId) {
     return gadgetId.substr(prefix.size());
 }
 
-enum class ProviderClass : std::size_t { Widget, Gadget, WidgetGadget, Event, Stats, Throwing, Count };
-
-struct LifeCounts {
-    std::atomic<unsigned> constructed{0};
-    std::atomic<unsigned> initialized{0};
-    std::atomic<unsigned> destroyed{0};
-};
-
-inline LifeCounts &lifeOf(ProviderClass cls) {
-    static std::array<LifeCounts, static_cast<std::size_t>(ProviderClass::Count)> counts;
-    return counts[static_cast<std::size_t>(cls)];
-}
-
-// Every provider class derives from this, so the factories' object sharing
-// and single initialization can be observed from outside.
-class CountedProvider : public virtual CmpiBaseMI {
+// An instance provider of this library: it counts its initializations, for
+// StatsProvider to report, and names its instances by the paths of what its
+// own enumInstances returns.
+class InstanceProvider : public CmpiInstanceMI {
 public:
-    CountedProvider(const CmpiBroker &mb, const CmpiContext &ctx, ProviderClass cls)
-        : CmpiBaseMI(mb, ctx), lifeCounts(lifeOf(cls)) {
-        ++lifeCounts.constructed;
-    }
-    ~CountedProvider() override { ++lifeCounts.destroyed; }
+    InstanceProvider(const CmpiBroker &mb, const CmpiContext &ctx) : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx) {}
 
     CmpiStatus initialize(const CmpiContext &) override {
-        ++lifeCounts.initialized;
+        ++initializations;
         return CmpiStatus(CMPI_RC_OK);
     }
-
-private:
-    LifeCounts &lifeCounts;
-};
-
-// An instance provider of this library: counted, and naming its instances
-// by the paths of what its own enumInstances returns.
-class InstanceProvider : public CmpiInstanceMI, public CountedProvider {
-public:
-    InstanceProvider(const CmpiBroker &mb, const CmpiContext &ctx, ProviderClass cls)
-        : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), CountedProvider(mb, ctx, cls) {}
 
     CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
                                  const CmpiObjectPath &cop) override {
         CmpiResultInstanceToPathFilter names(rslt);
         return enumInstances(ctx, names, cop, nullptr);
     }
+
+    std::atomic<unsigned> initializations{0};
 };
 
 }  // namespace testprovider

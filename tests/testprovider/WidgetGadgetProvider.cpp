@@ -1,8 +1,9 @@
 // Serves the association Test_WidgetGadget, which ties each widget (Owner)
 // to its gadget (Part), through both interfaces of one object: the instance
 // side enumerates the links, the association side walks them from either
-// end. The widget end is always resolved through an up-call, so it carries
-// the class the widget provider gives it (Test_SpecialWidget for gamma).
+// end, naming what it finds through the instance-to-path filter. The widget
+// end is always resolved through an up-call, so it carries the class the
+// widget provider gives it (Test_SpecialWidget for gamma).
 #include <optional>
 #include <string>
 
@@ -36,15 +37,11 @@ struct Link {
     const char *farRole() const { return fromWidget ? "Part" : "Owner"; }
     const CmpiObjectPath &far() const { return fromWidget ? gadget : widget; }
 
-    CmpiObjectPath path() const {
-        CmpiObjectPath link(ns, kLinkClass);
-        link.setKey("Owner", widget);
-        link.setKey("Part", gadget);
-        return link;
-    }
-
     CmpiInstance instance(const char **properties) const {
-        CmpiInstance link(path());
+        CmpiObjectPath path(ns, kLinkClass);
+        path.setKey("Owner", widget);
+        path.setKey("Part", gadget);
+        CmpiInstance link(path);
         link.setPropertyFilter(properties, nullptr);
         link.setProperty("Owner", widget);
         link.setProperty("Part", gadget);
@@ -64,7 +61,7 @@ class WidgetGadgetProvider : public InstanceProvider, public CmpiAssociationMI {
 public:
     WidgetGadgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
         : CmpiBaseMI(mb, ctx),
-          InstanceProvider(mb, ctx, ProviderClass::WidgetGadget),
+          InstanceProvider(mb, ctx),
           CmpiAssociationMI(mb, ctx) {}
 
     CmpiStatus enumInstances(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
@@ -90,9 +87,8 @@ public:
 
     CmpiStatus referenceNames(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
                               const char *resultClass, const char *role) override {
-        const std::optional<Link> link = linkOf(ctx, op);
-        if (link && link->passes(resultClass, role)) rslt.returnData(link->path());
-        return done(rslt);
+        CmpiResultInstanceToPathFilter names(rslt);
+        return references(ctx, names, op, resultClass, role, nullptr);
     }
 
     CmpiStatus associators(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
@@ -108,11 +104,8 @@ public:
     CmpiStatus associatorNames(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
                                const char *assocClass, const char *resultClass, const char *role,
                                const char *resultRole) override {
-        const std::optional<Link> link = linkOf(ctx, op);
-        if (link && link->passes(assocClass, role) && link->reaches(resultClass, resultRole)) {
-            rslt.returnData(link->far());
-        }
-        return done(rslt);
+        CmpiResultInstanceToPathFilter names(rslt);
+        return associators(ctx, names, op, assocClass, resultClass, role, resultRole, nullptr);
     }
 
 private:

@@ -50,7 +50,7 @@ CmpiInstance makeWidget(const CmpiString &ns, const Widget &widget, const char *
 class WidgetProvider : public InstanceProvider {
 public:
     WidgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx, ProviderClass::Widget) {}
+        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
 
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {

@@ -1,7 +1,8 @@
 // Values of every kind as tvxcim --json writes them, above all those a
 // careless rendering gets wrong: 64-bit integers past a double's precision,
-// reals JSON has no number for, NULL scalars, arrays and elements, nested
-// references and instances, and bytes that are not UTF-8.
+// reals JSON has no number for, NULL scalars, arrays and elements, embedded
+// instances, and bytes that are not UTF-8. Reference values and property
+// order show in the command output tests.
 #include <gtest/gtest.h>
 
 #include <cstdint>
@@ -13,8 +14,6 @@ namespace {
 
 using namespace tvxbroker;
 using tvxcim::Json;
-
-ObjectPath widgetPath() { return ObjectPath{"", "root/cimv2", "Test_Widget", {{"Name", CimValue::makeString("a")}}}; }
 
 struct ValueCase {
     const char *name;
@@ -56,10 +55,6 @@ INSTANTIATE_TEST_SUITE_P(
                   CimValue::makeArray(CMPI_uint64, {CimValue::makeUnsigned(CMPI_uint64, 1), CimValue::makeNull(CMPI_uint64)}),
                   R"({"type":"uint64[]","value":["1",null]})"},
         ValueCase{"EmptyArray", CimValue::makeArray(CMPI_string, {}), R"({"type":"string[]","value":[]})"},
-        ValueCase{"Reference", CimValue::makeReference(widgetPath()),
-                  R"({"type":"reference","value":{"text":"root/cimv2:Test_Widget.Name=\"a\"",
-                      "namespace":"root/cimv2","className":"Test_Widget",
-                      "keys":{"Name":{"type":"string","value":"a"}}}})"},
         ValueCase{"EmbeddedInstance",
                   CimValue::makeInstance(Instance{ObjectPath{"", "", "Test_Event", {}},
                                                   {{"Sequence", CimValue::makeUnsigned(CMPI_uint32, 7)}}}),
@@ -68,14 +63,6 @@ INSTANTIATE_TEST_SUITE_P(
                       "properties":{"Sequence":{"type":"uint32","value":7}}}})"},
         ValueCase{"UntypedNull", CimValue{}, R"({"type":null,"value":null})"}),
     [](const auto &test) { return std::string(test.param.name); });
-
-TEST(InstanceJsonTest, KeepsPropertyOrderAsStored) {
-    const Instance instance{widgetPath(),
-                            {{"Zeta", CimValue::makeBoolean(true)}, {"Alpha", CimValue::makeString("x")}}};
-    const Json json = tvxcim::instanceJson(instance);
-    ASSERT_EQ(json["properties"].size(), 2U);
-    EXPECT_EQ(json["properties"].begin().key(), "Zeta");
-}
 
 TEST(InstanceJsonTest, LineReplacesBytesThatAreNotUtf8) {
     const Json json = tvxcim::valueJson(CimValue::makeString("a\xff" "b"));

@@ -1,7 +1,8 @@
 // Every kind of bad input and failed request ends in exactly one line on
 // stderr, nothing on stdout and the documented exit status: 2 for a usage
-// error, 1 for everything else.
-#include <gmock/gmock.h>
+// error, 1 for everything else. How each provider fails to load, and each
+// path parse error, are the broker's and the model's own tests; here one of
+// each stands for all.
 #include <gtest/gtest.h>
 
 #include <stdexcept>
@@ -13,13 +14,6 @@ namespace {
 using namespace tvxcimtest;
 
 constexpr const char *kMissingFile = "/nonexistent/tvxcim-test-file";
-
-Args withFiles(const std::string &dir, const std::string &registration, const std::string &mof,
-               const Args &rest) {
-    Args args = {"--provider-dir", dir, "--registration", registration, "--mof", mof};
-    args.insert(args.end(), rest.begin(), rest.end());
-    return args;
-}
 
 struct ErrorCase {
     const char *name;
@@ -47,10 +41,6 @@ INSTANTIATE_TEST_SUITE_P(
         ErrorCase{"ValueNotQuoted", onTestProviders({"gi", "root/cimv2:Test_Widget.Name=zz"}), 1,
                   "malformed object path 'root/cimv2:Test_Widget.Name=zz': "
                   "value of Name must be quoted at position 28"},
-        ErrorCase{"PathWithoutNamespace", onTestProviders({"ain", R"(Test_Widget.Name="a")"}), 1,
-                  R"(malformed object path 'Test_Widget.Name="a"': missing ':' after the namespace at position 20)"},
-        ErrorCase{"KeyOfNoProperty", onTestProviders({"rin", R"(root/cimv2:Test_Widget.Id="a")"}), 1,
-                  R"(malformed object path 'root/cimv2:Test_Widget.Id="a"': class Test_Widget has no property Id at position 23)"},
         ErrorCase{"UnknownClassInPath", onTestProviders({"gi", R"(root/cimv2:Test_Widgt.Name="a")"}), 1,
                   R"(unknown class Test_Widgt in object path 'root/cimv2:Test_Widgt.Name="a"': no MOF file declares it)"},
         ErrorCase{"UnknownClass", onTestProviders({"ei", "root/cimv2:Nope"}), 1,
@@ -64,22 +54,12 @@ INSTANTIATE_TEST_SUITE_P(
         ErrorCase{"MissingLibrary", onTestProviders({"ei", "Test_Missing"}), 1,
                   "CMPI_RC_ERR_FAILED (1): provider MissingLib: provider library "
                   "libtvxnosuchlibrary.so not found in the provider directories"},
-        ErrorCase{"MissingFactory", onTestProviders({"--json", "gi", R"(root/cimv2:Test_NoFactory.Name="x")"}), 1,
-                  "CMPI_RC_ERR_FAILED (1): provider NoSuchProvider: library libtvxtestprovider.so "
-                  "has no factory NoSuchProvider_Create_InstanceMI"},
-        ErrorCase{"FactoryReturnsNull", onTestProviders({"ein", "Test_NullFactory"}), 1,
-                  "CMPI_RC_ERR_FAILED (1): provider NullProvider: factory "
-                  "NullProvider_Create_InstanceMI returned no interface"},
-        ErrorCase{"FactoryThrows", onTestProviders({"ei", "Test_ThrowingFactory"}), 1,
-                  "CMPI_RC_ERR_FAILED (1): provider ThrowingProvider: factory "
-                  "ThrowingProvider_Create_InstanceMI failed with an exception"},
-        ErrorCase{"StatusWithMessage", onTestProviders({"gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
+        ErrorCase{"StatusWithMessageEvenInJson",
+                  onTestProviders({"--json", "gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
                   "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
         ErrorCase{"StatusWithoutMessage",
                   onTestProviders({"gi", "root/cimv2:Test_ProviderStats.ProviderName=\"WidgetProvider\""}), 1,
                   "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
-        ErrorCase{"StatusOfUpCall", onTestProviders({"--json", "ai", R"(root/cimv2:Test_Gadget.Id="gadget-zz")"}), 1,
-                  "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
         ErrorCase{"MissingRegistration",
                   withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
                   std::string("cannot read ") + kMissingFile},

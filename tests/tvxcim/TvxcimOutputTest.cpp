@@ -1,5 +1,7 @@
 // What each command prints for representative test provider instances, in
-// MOF and as JSON, and the demo's sections in both forms.
+// MOF and as JSON, and the demo's sections in both forms. The whole of an
+// instance shows in the JSON cases; how each value kind is written in MOF is
+// the model's own test.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -10,22 +12,8 @@
 namespace {
 
 using namespace tvxcimtest;
-using testing::ElementsAre;
 using testing::HasSubstr;
 using Json = nlohmann::ordered_json;
-
-const std::string kAlphaMof = R"(// root/cimv2:Test_Widget.Name="alpha"
-instance of Test_Widget
-{
-    Name = "alpha";
-    Caption = "Widget alpha";
-    Size = 1;
-    Tags = {"test", "alpha"};
-    Created = "20200101000001.000000+000";
-    Enabled = TRUE;
-};
-
-)";
 
 const std::string kLinkAlpha =
     R"(root/cimv2:Test_WidgetGadget.Owner="root/cimv2:Test_Widget.Name=\"alpha\"",)"
@@ -51,7 +39,9 @@ TEST_P(MofOutputTest, PrintsInstancesAsMofAndPathsAsText) {
 INSTANTIATE_TEST_SUITE_P(
     Commands, MofOutputTest,
     testing::Values(
-        OutputCase{"GetInstance", {"gi", kAlpha}, kAlphaMof},
+        OutputCase{"GetInstanceWithPropertyList", {"--properties", "Tags", "gi", kAlpha},
+                   "// " + std::string(kAlpha) +
+                       "\ninstance of Test_Widget\n{\n    Tags = {\"test\", \"alpha\"};\n};\n\n"},
         OutputCase{"Enumerate", {"--properties", "Size,Enabled", "ei", "Test_SpecialWidget"},
                    "// root/cimv2:Test_SpecialWidget.Name=\"gamma\"\ninstance of Test_SpecialWidget\n{\n"
                    "    Size = 3;\n    Enabled = TRUE;\n};\n\n"},
@@ -78,22 +68,8 @@ std::vector<Json> jsonLines(const std::string &text) {
     return objects;
 }
 
-// Whitespace-separated JSON values, laid out as a reader finds clearest.
-std::vector<Json> jsonValues(const std::string &text) {
-    std::vector<Json> values;
-    std::istringstream stream(text);
-    while (!(stream >> std::ws).eof()) {
-        Json value;
-        stream >> value;
-        values.push_back(std::move(value));
-    }
-    return values;
-}
-
 const char *const kAlphaPathJson = R"({"text":"root/cimv2:Test_Widget.Name=\"alpha\"","namespace":"root/cimv2",
     "className":"Test_Widget","keys":{"Name":{"type":"string","value":"alpha"}}})";
-const char *const kGammaPathJson = R"({"text":"root/cimv2:Test_SpecialWidget.Name=\"gamma\"",
-    "namespace":"root/cimv2","className":"Test_SpecialWidget","keys":{"Name":{"type":"string","value":"gamma"}}})";
 const char *const kGadgetAlphaPathJson = R"({"text":"root/cimv2:Test_Gadget.Id=\"gadget-alpha\"",
     "namespace":"root/cimv2","className":"Test_Gadget","keys":{"Id":{"type":"string","value":"gadget-alpha"}}})";
 
@@ -108,20 +84,20 @@ std::string withAlphaAndGadget(const std::string &pattern) {
 
 class JsonOutputTest : public testing::TestWithParam<OutputCase> {};
 
-// `out` holds the expected objects, with $ALPHA and $GADGET
-// standing for the paths of widget alpha and its gadget.
+// `out` holds the one expected object, with $ALPHA and $GADGET standing for
+// the paths of widget alpha and its gadget. Which command asks the broker for
+// what shows in the MOF cases; these cover the shapes of instances, paths and
+// reference values.
 TEST_P(JsonOutputTest, PrintsOneObjectPerLine) {
-    Args args = {"--json"};
-    args.insert(args.end(), GetParam().args.begin(), GetParam().args.end());
-    const Outcome run = runOnTestProviders(args);
+    const Outcome run = runOnTestProviders(GetParam().args);
     ASSERT_EQ(run.status, 0) << run.err;
-    EXPECT_EQ(jsonLines(run.out), jsonValues(withAlphaAndGadget(GetParam().out)));
+    EXPECT_EQ(jsonLines(run.out), std::vector<Json>{Json::parse(withAlphaAndGadget(GetParam().out))});
 }
 
 INSTANTIATE_TEST_SUITE_P(
     Commands, JsonOutputTest,
     testing::Values(
-        OutputCase{"GetInstance", {"gi", kAlpha},
+        OutputCase{"GetInstance", {"--json", "gi", kAlpha},
                    R"({"className":"Test_Widget","path":$ALPHA,"properties":{
                        "Name":{"type":"string","value":"alpha"},
                        "Caption":{"type":"string","value":"Widget alpha"},
@@ -129,21 +105,8 @@ INSTANTIATE_TEST_SUITE_P(
                        "Tags":{"type":"string[]","value":["test","alpha"]},
                        "Created":{"type":"datetime","value":"20200101000001.000000+000"},
                        "Enabled":{"type":"boolean","value":true}}})"},
-        OutputCase{"EnumerateNames", {"ein", "Test_SpecialWidget"}, kGammaPathJson},
-        OutputCase{"Enumerate", {"--properties", "Size", "ei", "Test_SpecialWidget"},
-                   std::string(R"({"className":"Test_SpecialWidget","path":)") + kGammaPathJson +
-                       R"(,"properties":{"Size":{"type":"uint32","value":3}}})"},
-        OutputCase{"AssociatorNames", {"ain", kAlpha}, "$GADGET"},
-        OutputCase{"Associators", {"ai", kAlpha},
-                   R"({"className":"Test_Gadget","path":$GADGET,"properties":{
-                       "Id":{"type":"string","value":"gadget-alpha"},
-                       "WidgetName":{"type":"string","value":"alpha"}}})"},
-        OutputCase{"ReferenceNames", {"rin", kAlpha},
-                   R"({"text":)" + Json(kLinkAlpha).dump() + R"(,"namespace":"root/cimv2",
-                       "className":"Test_WidgetGadget","keys":{
-                       "Owner":{"type":"reference","value":$ALPHA},
-                       "Part":{"type":"reference","value":$GADGET}}})"},
-        OutputCase{"References", {"--properties", "Part", "ri", kGadgetAlpha},
+        OutputCase{"AssociatorNames", {"--json", "ain", kAlpha}, "$GADGET"},
+        OutputCase{"References", {"--json", "--properties", "Part", "ri", kGadgetAlpha},
                    R"({"className":"Test_WidgetGadget","path":{"text":)" + Json(kLinkAlpha).dump() +
                        R"(,"namespace":"root/cimv2","className":"Test_WidgetGadget","keys":{
                        "Owner":{"type":"reference","value":$ALPHA},
@@ -151,34 +114,20 @@ INSTANTIATE_TEST_SUITE_P(
                        "properties":{"Part":{"type":"reference","value":$GADGET}}})"}),
     [](const auto &test) { return std::string(test.param.name); });
 
-const Args kDemo = {"--seconds", "60", "demo"};
-
-TEST(TvxcimDemoTest, MofShowsEverySectionAndFailuresInPlace) {
-    const Outcome run = runOnTestProviders(kDemo);
+// Which sections the demo shows, and in what order, is checked in the JSON
+// form below; the MOF headings, instances and first indication on the
+// built-in host are checked end to end (tests/e2e/check_demo.cmake).
+TEST(TvxcimDemoTest, MofShowsFailuresInPlace) {
+    const Outcome run = runOnTestProviders({"--seconds", "60", "demo"});
     ASSERT_EQ(run.status, 0) << run.err;
-    std::vector<std::string> headings;
-    for (const std::string &line : lines(run.out)) {
-        if (line.rfind("== ", 0) == 0) headings.push_back(line);
-    }
-    EXPECT_THAT(headings,
-                ElementsAre("== ei Test_Widget", "== ei Test_SpecialWidget", "== ei Test_Gadget",
-                            "== ei Test_WidgetGadget", "== ei Test_EventCounter", "== ei Test_ProviderStats",
-                            "== ei Test_Missing", "== ei Test_NoFactory", "== ei Test_NullFactory",
-                            "== ei Test_ThrowingFactory", "== ain " + std::string(kAlpha),
-                            "== ain root/cimv2:Test_SpecialWidget.Name=\"gamma\"", "== ain " + std::string(kGadgetAlpha),
-                            "== first indication of Test_Event"));
     EXPECT_THAT(run.out, HasSubstr("== ei Test_Missing\n   CMPI_RC_ERR_FAILED (1): provider MissingLib: "));
-    EXPECT_THAT(run.out, HasSubstr("== first indication of Test_Event\n// root/cimv2:Test_Event\n"
-                                   "instance of Test_Event\n{\n    Sequence = 0;\n"));
-    // Shown in place in the output, and by the broker once each on stderr.
-    EXPECT_EQ(lines(run.err).size(), 4U) << run.err;
 }
 
 TEST(TvxcimDemoTest, JsonWritesEachSectionAsOneObject) {
-    Args args = {"--json"};
-    args.insert(args.end(), kDemo.begin(), kDemo.end());
-    const Outcome run = runOnTestProviders(args);
+    const Outcome run = runOnTestProviders({"--json", "--seconds", "60", "demo"});
     ASSERT_EQ(run.status, 0) << run.err;
+    // Failures shown in place in the output, and by the broker once each on stderr.
+    EXPECT_EQ(lines(run.err).size(), 4U) << run.err;
     const std::vector<Json> sections = jsonLines(run.out);
     ASSERT_EQ(sections.size(), 14U);
     EXPECT_EQ(sections[0]["section"], "ei");

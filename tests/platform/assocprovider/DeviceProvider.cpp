@@ -1,0 +1,119 @@
+// Fixed systems and devices served as instances, and the associations
+// between them on OMC::SimpleAssociationMI. Like the product's providers it
+// answers associations from paths alone and reuses one instance per
+// association class for all its answers; unlike them it ignores every filter,
+// so the tests see the filtering the base does. Every reference is rebuilt
+// without a namespace, not copied from the request, so the base must
+// recognise the source end. Any system name exists; devices are those listed.
+#include <algorithm>
+#include <iterator>
+#include <string>
+
+#include "CmpiInstanceMI.h"
+#include "CmpiProviderFactory.h"
+#include "platform/OmcSimpleAssociationMI.h"
+
+namespace {
+
+constexpr const char *kDevices[] = {"disk0", "nic0", "disk1"};
+
+struct Link {
+    const char *assocClass;
+    const char *system;
+    const char *deviceClass;
+    const char *device;
+};
+
+constexpr Link kLinks[] = {
+    {"Test_HostedDevice", "alpha", "Test_Disk", "disk0"},
+    {"Test_HostedDevice", "alpha", "Test_Device", "nic0"},
+    {"Test_HostedDevice", "alpha", "Test_Disk", "ghost"},  // a device that does not exist
+    {"Test_SpareDevice", "alpha", "Test_Disk", "disk1"},
+    {"Test_HostedDevice", "beta", "Test_Disk", "disk0"},
+    {"Test_HostedDevice", "broken", "Test_Disk", "disk9"},
+};
+
+// Asking for the associations of the broken system fails; those of the
+// confused one come back as a path, which no association is.
+constexpr const char *kBrokenSystem = "broken";
+constexpr const char *kConfusedSystem = "confused";
+// This device's one association leads to a system named after the filters
+// doReferences was given, in their order, "(null)" for a null one.
+constexpr const char *kEchoDevice = "echo";
+
+CmpiObjectPath keyedPath(const char *className, const char *key, const std::string &value) {
+    CmpiObjectPath path(nullptr, className);
+    path.setKey(key, value.c_str());
+    return path;
+}
+
+std::string stringKey(const CmpiObjectPath &path, const char *key) {
+    const CmpiData value = path.getKey(key);
+    if (value.isNotFound() || value.isNullValue()) throw CmpiStatus(CMPI_RC_ERR_INVALID_PARAMETER, "key missing");
+    return static_cast<const char *>(value);
+}
+
+class DeviceProvider : public CmpiInstanceMI, public OMC::SimpleAssociationMI {
+public:
+    DeviceProvider(const CmpiBroker &mb, const CmpiContext &ctx)
+        : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), SimpleAssociationMI(mb, ctx) {}
+
+    CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
+                           const char **properties) override {
+        const bool isSystem = cop.classPathIsA("Test_System");
+        const char *key = isSystem ? "Name" : "DeviceID";
+        const std::string name = stringKey(cop, key);
+        if (!isSystem && std::find(std::begin(kDevices), std::end(kDevices), name) == std::end(kDevices)) {
+            return CmpiStatus(CMPI_RC_ERR_NOT_FOUND, name.c_str());
+        }
+        CmpiInstance instance(cop);
+        const char *keys[] = {key, nullptr};
+        instance.setPropertyFilter(properties, keys);
+        instance.setProperty(key, name.c_str());
+        if (!isSystem) {
+            instance.setProperty("Model", "Kestrel");
+            instance.setProperty("Size", CMPIUint32(500));
+        }
+        rslt.returnData(instance);
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
+    CmpiStatus doReferences(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &op, const char *assocClass,
+                            const char *resultClass, const char *role, const char *resultRole) override {
+        const bool fromSystem = op.classPathIsA("Test_System");
+        if (!fromSystem && !op.classPathIsA("Test_Device")) return CmpiStatus(CMPI_RC_OK);
+        const std::string name = stringKey(op, fromSystem ? "Name" : "DeviceID");
+        const CmpiString ns = op.getNameSpace();
+        CmpiInstance hosted(CmpiObjectPath(ns, "Test_HostedDevice"));
+        CmpiInstance spare(CmpiObjectPath(ns, "Test_SpareDevice"));
+        if (fromSystem && name == kConfusedSystem) rslt.returnData(op);
+        if (!fromSystem && name == kEchoDevice) {
+            std::string filters;
+            for (const char *filter : {assocClass, resultClass, role, resultRole}) {
+                filters += std::string(filters.empty() ? "" : " ") + (filter != nullptr ? filter : "(null)");
+            }
+            hosted.setProperty("Antecedent", keyedPath("Test_System", "Name", filters));
+            hosted.setProperty("Dependent", keyedPath("Test_Device", "DeviceID", name));
+            rslt.returnData(hosted);
+        }
+        for (const Link &link : kLinks) {
+            if (name != (fromSystem ? link.system : link.device)) continue;
+            CmpiInstance &association = std::string(link.assocClass) == "Test_SpareDevice" ? spare : hosted;
+            association.setProperty("Antecedent", keyedPath("Test_System", "Name", link.system));
+            association.setProperty("Dependent", keyedPath(link.deviceClass, "DeviceID", link.device));
+            association.setProperty("Note", link.device);
+            rslt.returnData(association);
+        }
+        // Ending the results is the base's job; a provider that does it too must not end them early.
+        rslt.returnDone();
+        if (fromSystem && name == kBrokenSystem) return CmpiStatus(CMPI_RC_ERR_FAILED, "broken system");
+        return CmpiStatus(CMPI_RC_OK);
+    }
+};
+
+}  // namespace
+
+CMProviderBase(OmcTestDevices);
+CMInstanceMIFactory(DeviceProvider, OmcTestDevices)
+CMAssociationMIFactory(DeviceProvider, OmcTestDevices)
