@@ -20,11 +20,6 @@ CimValue scalarToModel(const CMPIValue &v, CMPIType type, CMPIrc *rc) {
     case CMPI_sint64: out.signedValue = v.sint64; break;
     case CMPI_real32: out.real = v.real32; break;
     case CMPI_real64: out.real = v.real64; break;
-    case CMPI_chars:
-        out.type = CMPI_string;
-        out.null = v.chars == nullptr;
-        if (v.chars != nullptr) out.text = v.chars;
-        break;
     case CMPI_string: {
         EncString *s = stringOf(v.string);
         if (s == nullptr && v.string != nullptr) *rc = CMPI_RC_ERR_INVALID_HANDLE;
@@ -62,9 +57,13 @@ CimValue scalarToModel(const CMPIValue &v, CMPIType type, CMPIrc *rc) {
 
 CimValue toModel(const CMPIValue *value, CMPIType type, CMPIrc *rc) {
     *rc = CMPI_RC_OK;
-    if (value == nullptr) {
-        return CimValue::makeNull(type == CMPI_chars ? CMPIType(CMPI_string) : type);
+    // As sfcb and OpenPegasus read it: for CMPI_chars the argument is the C
+    // string itself, and the value is kept as a string.
+    if (type == CMPI_chars) {
+        if (value == nullptr) return CimValue::makeNull(CMPI_string);
+        return CimValue::makeString(reinterpret_cast<const char *>(value));
     }
+    if (value == nullptr) return CimValue::makeNull(type);
     if ((type & CMPI_ARRAY) != 0) {
         EncArray *array = arrayOf(value->array);
         if (array == nullptr) {

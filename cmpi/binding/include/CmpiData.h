@@ -58,7 +58,8 @@ public:
     operator CmpiArray() const;  // NOLINT
     operator CmpiDateTime() const;  // NOLINT
 
-    // The C value to hand to a broker; valid while this object lives.
+    // The value argument to hand to a broker with type(): for CMPI_chars the
+    // C string itself, else a CMPIValue; valid while this object lives.
     const CMPIValue *value() const;
     const CMPIData &getEnc() const { return data; }
 
@@ -67,5 +68,4 @@ private:
 
     CMPIData data;
     std::string chars;  // the text of a chars value, owned here
-    mutable CMPIValue scratch{};
 };

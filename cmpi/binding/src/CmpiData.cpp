@@ -70,11 +70,11 @@ CmpiData::CmpiData(const CmpiArray &value)
 CmpiData::CmpiData(const CmpiDateTime &value)
     : data(objectData(CMPI_dateTime, value.getEnc(), &CMPIValue::dateTime)) {}
 
+// Brokers read a CMPI_chars value as the C string itself, not as a
+// CMPIValue holding it: the convention of every C provider.
 const CMPIValue *CmpiData::value() const {
     if (data.type == CMPI_chars) {
-        scratch = data.value;
-        scratch.chars = isNullValue() ? nullptr : const_cast<char *>(chars.c_str());
-        return &scratch;
+        return isNullValue() ? nullptr : reinterpret_cast<const CMPIValue *>(chars.c_str());
     }
     return &data.value;
 }
