@@ -18,8 +18,12 @@ Response Broker::enumInstances(const ObjectPath &classPath, const PropertyList &
     return requests::enumInstances(*state, classPath, properties);
 }
 
+// sfcb answers a client whose getInstance the provider answered with
+// nothing as it would for an unknown instance.
 Response Broker::getInstance(const ObjectPath &path, const PropertyList &properties) {
-    return requests::getInstance(*state, path, properties);
+    Response response = requests::getInstance(*state, path, properties);
+    if (response.ok() && response.instances.empty()) response.rc = CMPI_RC_ERR_NOT_FOUND;
+    return response;
 }
 
 Response Broker::createInstance(const ObjectPath &path, const Instance &instance) {

@@ -7,6 +7,7 @@
 #include "core/BrokerState.h"
 #include "core/EncSupport.h"
 #include "model/CimDateTime.h"
+#include "model/InstanceOfClass.h"
 #include "model/MofInstanceText.h"
 
 namespace tvxbroker {
@@ -15,14 +16,17 @@ namespace {
 
 using enc::setRc;
 
-CMPIInstance *newInstance(const CMPIBroker *, const CMPIObjectPath *op, CMPIStatus *rc) {
+CMPIInstance *newInstance(const CMPIBroker *mb, const CMPIObjectPath *op, CMPIStatus *rc) {
     EncObjectPath *path = enc::pathOf(op);
     if (path == nullptr) {
         setRc(rc, CMPI_RC_ERR_INVALID_HANDLE);
         return nullptr;
     }
     setRc(rc, CMPI_RC_OK);
-    return enc::newInstance(Instance{path->value, {}});
+    const ClassSchema &schema = stateOf(mb).config.schema;
+    CMPIInstance *handle = enc::newInstance(instanceOfClass(path->value, schema));
+    enc::instanceOf(handle)->schema = &schema;
+    return handle;
 }
 
 CMPIObjectPath *newObjectPath(const CMPIBroker *, const char *ns, const char *cn,

@@ -2,6 +2,7 @@
 #include <cctype>
 
 #include "core/EncSupport.h"
+#include "model/InstanceOfClass.h"
 
 namespace tvxbroker::enc {
 
@@ -80,7 +81,9 @@ CMPIStatus setProperty(const CMPIInstance *inst, const char *name, const CMPIVal
 
 CMPIObjectPath *getObjectPath(const CMPIInstance *inst, CMPIStatus *rc) {
     EncInstance *instance = reportLookup(instanceOf(inst), rc);
-    return instance == nullptr ? nullptr : newObjectPath(instance->value.path);
+    if (instance == nullptr) return nullptr;
+    return newObjectPath(instance->schema != nullptr ? pathFromClassKeys(instance->value, *instance->schema)
+                                                     : instance->value.path);
 }
 
 CMPIStatus setPropertyFilter(CMPIInstance *inst, const char **properties, const char **keys) {
@@ -95,11 +98,10 @@ CMPIStatus setPropertyFilter(CMPIInstance *inst, const char **properties, const 
     for (const char **key = keys; key != nullptr && *key != nullptr; ++key) {
         names.insert(lowered(*key));
     }
+    // As in sfcb, the filter keeps out later properties only: what the
+    // instance already holds (its class defaults and the keys of its path)
+    // stays. The broker applies the client's property list on the way out.
     instance->filter = std::move(names);
-    auto &props = instance->value.properties;
-    props.erase(std::remove_if(props.begin(), props.end(),
-                               [&](const NamedValue &p) { return !admitted(*instance, p.name); }),
-                props.end());
     return status(CMPI_RC_OK);
 }
 

@@ -13,6 +13,7 @@
 #include "core/Broker.h"
 #include "core/ObjectPool.h"
 #include "model/CimValue.h"
+#include "model/ClassSchema.h"
 
 namespace tvxbroker {
 
@@ -40,6 +41,9 @@ struct EncObjectPath : Encapsulated<CMPIObjectPath> {
 
 struct EncInstance : Encapsulated<CMPIInstance> {
     Instance value;
+    // Set on instances a provider made from a class: their path is then made
+    // of the class's key properties, as sfcb makes it.
+    const ClassSchema *schema = nullptr;
     // Lower-cased names that may be set; none means every property.
     std::optional<std::set<std::string>> filter;
 };

@@ -1,6 +1,10 @@
 #include "core/Requests.h"
 
+#include <algorithm>
+#include <iterator>
+
 #include "core/EncSupport.h"
+#include "model/InstanceOfClass.h"
 
 namespace tvxbroker::requests {
 
@@ -21,6 +25,16 @@ private:
 };
 
 const char *orNull(const std::string &text) { return text.empty() ? nullptr : text.c_str(); }
+
+// What a client receives of the instances a provider returned from `first`
+// on: each on the path its class's keys make. Like sfcb, the broker leaves
+// the property list to the providers' filters.
+void presentInstances(const Broker::State &state, Response &response, std::size_t first) {
+    for (std::size_t index = first; index < response.instances.size(); ++index) {
+        Instance &instance = response.instances[index];
+        instance.path = pathFromClassKeys(instance, state.config.schema);
+    }
+}
 
 bool servesNamespace(const ProviderRegistration &registration, const std::string &nameSpace) {
     for (const std::string &served : registration.namespaces) {
@@ -106,11 +120,13 @@ Response askInstanceProviders(Broker::State &state, const ObjectPath &path, bool
     for (const InstanceTarget &target : targets) {
         ObjectPath targetPath = path;
         targetPath.className = target.className;
+        const std::size_t first = response.instances.size();
         state.callProvider(target.provider, InterfaceKind::Instance, path.nameSpace, response,
                            [&](void *mi, const CMPIContext *ctx, const CMPIResult *rslt) {
                                return call(static_cast<CMPIInstanceMI *>(mi), ctx, rslt,
                                            enc::newObjectPath(targetPath));
                            });
+        presentInstances(state, response, first);
         if (!response.ok()) break;
     }
     return response;
@@ -199,6 +215,7 @@ Response association(Broker::State &state, AssociationCall call, const ObjectPat
         state, &ProviderRegistration::association, routingClass, path.nameSpace, true);
     CPropertyList list(properties);
     for (const std::string &provider : providers) {
+        const std::size_t first = response.instances.size();
         state.callProvider(
             provider, InterfaceKind::Association, path.nameSpace, response,
             [&](void *handle, const CMPIContext *ctx, const CMPIResult *rslt) {
@@ -222,20 +239,30 @@ Response association(Broker::State &state, AssociationCall call, const ObjectPat
                 }
                 return enc::status(CMPI_RC_ERR_NOT_SUPPORTED);
             });
+        presentInstances(state, response, first);
         if (!response.ok()) break;
     }
     return response;
 }
 
+// sfcb hands a subscription to providers only for these classes and theirs.
+bool forwardedIndication(const ClassSchema &schema, const std::string &className) {
+    static const char *const forwarded[] = {"CIM_ProcessIndication", "CIM_InstCreation", "CIM_InstDeletion",
+                                            "CIM_InstModification"};
+    return std::any_of(std::begin(forwarded), std::end(forwarded),
+                       [&](const char *ancestor) { return schema.isA(className, ancestor); });
+}
+
 Response indication(Broker::State &state, IndicationCall call, const IndicationRequest &request) {
     Response response;
     if (!knownClass(state, request.indicationClass, response)) return response;
-    const std::vector<std::string> providers =
+    std::vector<std::string> providers =
         providersFor(state, &ProviderRegistration::indication, request.indicationClass,
                      request.nameSpace, true);
+    if (!forwardedIndication(state.config.schema, request.indicationClass)) providers.clear();
     if (providers.empty()) {
         response.rc = CMPI_RC_ERR_NOT_SUPPORTED;
-        response.message = "no indication provider serves class " + request.indicationClass;
+        response.message = "No supported indication classes in filter query or no provider found";
     }
     for (const std::string &provider : providers) {
         state.callProvider(

@@ -80,18 +80,24 @@ const PropertyDecl *ClassSchema::findProperty(const std::string &cls, const std:
     return nullptr;
 }
 
-std::vector<PropertyDecl> ClassSchema::keysOf(const std::string &cls) const {
+std::vector<PropertyDecl> ClassSchema::propertiesOf(const std::string &cls) const {
     const auto chain = chainOf(cls);
-    std::vector<PropertyDecl> keys;
+    std::vector<PropertyDecl> properties;
     for (auto decl = chain.rbegin(); decl != chain.rend(); ++decl) {
         for (const PropertyDecl &property : (*decl)->properties) {
-            const bool seen = std::any_of(keys.begin(), keys.end(), [&](const PropertyDecl &key) {
-                return equalsIgnoreCase(key.name, property.name);
+            const bool seen = std::any_of(properties.begin(), properties.end(), [&](const PropertyDecl &known) {
+                return equalsIgnoreCase(known.name, property.name);
             });
-            // The most derived declaration describes the key, wherever it was first declared.
-            if (property.key && !seen) keys.push_back(*findProperty(cls, property.name));
+            if (!seen) properties.push_back(*findProperty(cls, property.name));
         }
     }
+    return properties;
+}
+
+std::vector<PropertyDecl> ClassSchema::keysOf(const std::string &cls) const {
+    std::vector<PropertyDecl> keys = propertiesOf(cls);
+    keys.erase(std::remove_if(keys.begin(), keys.end(), [](const PropertyDecl &property) { return !property.key; }),
+               keys.end());
     return keys;
 }
 

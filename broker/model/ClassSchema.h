@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "cmpi/cmpidt.h"
+#include "model/CimValue.h"
 
 namespace tvxbroker {
 
@@ -17,6 +18,7 @@ struct PropertyDecl {
     CMPIType type = CMPI_null;   // CMPI_ARRAY set for arrays
     std::string referenceClass;  // for CMPI_ref
     bool key = false;            // also set when an ancestor declares the property as key
+    CimValue defaultValue;       // null when the MOF gives none
 };
 
 struct ClassDecl {
@@ -41,6 +43,9 @@ public:
     std::vector<std::string> selfAndSubclasses(const std::string &cls) const;  // declaration order
     const PropertyDecl *findProperty(const std::string &cls, const std::string &prop) const;
     std::vector<PropertyDecl> keysOf(const std::string &cls) const;  // base class first
+    // Every property, inherited ones included, base class first; each once,
+    // as its most derived declaration describes it.
+    std::vector<PropertyDecl> propertiesOf(const std::string &cls) const;
     bool isAssociation(const std::string &cls) const;
     bool isIndication(const std::string &cls) const;
 

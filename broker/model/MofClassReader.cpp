@@ -1,8 +1,11 @@
 #include "model/MofClassReader.h"
 
+#include <cerrno>
+#include <cstdlib>
 #include <utility>
 
 #include "model/CimTypes.h"
+#include "model/CimDateTime.h"
 #include "model/CimValue.h"
 #include "model/MofLexer.h"
 
@@ -188,16 +191,95 @@ private:
             property.type |= CMPI_ARRAY;
         }
         if (token_.isPunct('=')) {
-            skipPastSemicolon();
-        } else {
-            expectPunct(';');
+            advance();
+            property.defaultValue = readDefault(property);
         }
+        expectPunct(';');
         for (const PropertyDecl &earlier : decl.properties) {
             if (equalsIgnoreCase(earlier.name, property.name)) {
                 lexer_.fail(line, "property " + property.name + " declared twice in class " + decl.name);
             }
         }
         decl.properties.push_back(std::move(property));
+    }
+
+    // A property's initializer, typed as the property: brokers fill it into
+    // every new instance of the class.
+    CimValue readDefault(const PropertyDecl &property) {
+        if (token_.isWord("null")) {
+            advance();
+            return CimValue::makeNull(property.type);
+        }
+        const CMPIType elementType = static_cast<CMPIType>(property.type & ~CMPI_ARRAY);
+        if ((property.type & CMPI_ARRAY) == 0) return readLiteral(elementType, property.name);
+        expectPunct('{');
+        std::vector<CimValue> elements;
+        while (!token_.isPunct('}')) {
+            if (!elements.empty()) expectPunct(',');
+            elements.push_back(readLiteral(elementType, property.name));
+        }
+        advance();
+        return CimValue::makeArray(elementType, std::move(elements));
+    }
+
+    CimValue readLiteral(CMPIType type, const std::string &property) {
+        const int line = token_.line;
+        const auto refuse = [&] { lexer_.fail(line, "default value of " + property + " does not fit its type"); };
+        const bool negative = token_.isPunct('-');
+        if (negative) advance();
+        const MofToken literal = token_;
+        advance();
+        CimValue value;
+        if (literal.kind == MofToken::Number) {
+            if (!numberValue(type, literal.text, negative, value)) refuse();
+        } else if (literal.kind == MofToken::String && !negative && (type == CMPI_string || type == CMPI_dateTime)) {
+            std::string text = unescaped(literal.text);
+            while (token_.kind == MofToken::String) {  // adjacent literals join
+                text += unescaped(token_.text);
+                advance();
+            }
+            value = CimValue::makeString(std::move(text));
+            if (type == CMPI_dateTime) {
+                DateTime dateTime;
+                if (!parseCimDateTime(value.text, dateTime)) refuse();
+                value = CimValue::makeDateTime(dateTime);
+            }
+        } else if (type == CMPI_boolean && !negative && (literal.isWord("true") || literal.isWord("false"))) {
+            value = CimValue::makeBoolean(literal.isWord("true"));
+        } else {
+            refuse();
+        }
+        return value;
+    }
+
+    static bool numberValue(CMPIType type, const std::string &text, bool negative, CimValue &value) {
+        errno = 0;
+        char *end = nullptr;
+        if (type == CMPI_real32 || type == CMPI_real64) {
+            const double real = std::strtod(text.c_str(), &end);
+            value = CimValue::makeReal(type, negative ? -real : real);
+        } else if ((type & CMPI_SINT) == CMPI_SINT) {
+            const long long number = std::strtoll(text.c_str(), &end, 0);
+            value = CimValue::makeSigned(type, negative ? -number : number);
+        } else if ((type & CMPI_SINT) == CMPI_UINT && !negative) {
+            value = CimValue::makeUnsigned(type, std::strtoull(text.c_str(), &end, 0));
+        } else {
+            return false;
+        }
+        return errno == 0 && end != nullptr && *end == '\0';
+    }
+
+    static std::string unescaped(const std::string &literal) {
+        std::string text;
+        for (std::size_t i = 0; i < literal.size(); ++i) {
+            if (literal[i] != '\\' || i + 1 == literal.size()) {
+                text += literal[i];
+                continue;
+            }
+            const char escaped = literal[++i];
+            text += escaped == 'n' ? '\n' : escaped == 't' ? '\t' : escaped == 'r' ? '\r' : escaped;
+        }
+        return text;
     }
 
     MofLexer lexer_;

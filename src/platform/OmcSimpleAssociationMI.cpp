@@ -6,6 +6,7 @@
 
 #include "platform/OmcAssociationCollector.h"
 #include "platform/OmcAssociationInstance.h"
+#include "platform/OmcFarEnds.h"
 #include "platform/OmcObjectIdentity.h"
 
 namespace OMC {
@@ -46,9 +47,8 @@ std::optional<std::vector<AssociationEnd>> farEnds(const CmpiInstance &associati
 // Runs doReferences with `filters`, then hands `visit` every association
 // that passes the association-class and role filters, with its far ends.
 template <class Visit>
-CmpiStatus traverse(SimpleAssociationMI &provider, const CmpiContext &ctx, CmpiResult &rslt,
-                    const CmpiObjectPath &source, const Filters &filters,
-                    const char **properties, Visit &&visit) {
+CmpiStatus traverse(SimpleAssociationMI &provider, const CmpiContext &ctx, const CmpiObjectPath &source,
+                    const Filters &filters, const char **properties, Visit &&visit) {
     AssociationCollector found(source.getNameSpace(), properties);
     const CmpiStatus status = provider.doReferences(ctx, found, source, filters.assocClass,
                                                     filters.resultClass, filters.role,
@@ -60,17 +60,15 @@ CmpiStatus traverse(SimpleAssociationMI &provider, const CmpiContext &ctx, CmpiR
             farEnds(association, source, filters.role);
         if (far) visit(association, *far);
     }
-    rslt.returnDone();
     return status;
 }
 
 // Hands `visit` the path of every far end that passes the result filters.
 template <class Visit>
 CmpiStatus traverseToFarEnds(SimpleAssociationMI &provider, const CmpiContext &ctx,
-                             CmpiResult &rslt, const CmpiObjectPath &source,
-                             const Filters &filters, Visit &&visit) {
+                             const CmpiObjectPath &source, const Filters &filters, Visit &&visit) {
     const CmpiString ns = source.getNameSpace();
-    return traverse(provider, ctx, rslt, source, filters, nullptr,
+    return traverse(provider, ctx, source, filters, nullptr,
                     [&](const CmpiInstance &, const std::vector<AssociationEnd> &ends) {
                         for (const AssociationEnd &end : ends) {
                             if (!roleMatches(end.role, filters.resultRole)) continue;
@@ -78,6 +76,12 @@ CmpiStatus traverseToFarEnds(SimpleAssociationMI &provider, const CmpiContext &c
                             if (classMatches(far, filters.resultClass)) visit(far);
                         }
                     });
+}
+
+// The end of results follows a successful answer, once.
+CmpiStatus finish(CmpiResult &rslt, const CmpiStatus &status) {
+    if (status.rc() == CMPI_RC_OK) rslt.returnDone();
+    return status;
 }
 
 }  // namespace
@@ -91,42 +95,39 @@ CmpiStatus SimpleAssociationMI::associators(const CmpiContext &ctx, CmpiResult &
                                             const CmpiObjectPath &op, const char *assocClass,
                                             const char *resultClass, const char *role,
                                             const char *resultRole, const char **properties) {
-    return traverseToFarEnds(*this, ctx, rslt, op, {assocClass, resultClass, role, resultRole},
-                             [&](const CmpiObjectPath &far) {
-                                 CmpiInstance instance;
-                                 try {
-                                     instance = broker.getInstance(ctx, far, properties);
-                                 } catch (const CmpiStatus &) {
-                                     return;
-                                 }
-                                 if (!instance.isNull()) rslt.returnData(instance);
-                             });
+    std::vector<CmpiObjectPath> farEnds;
+    const CmpiStatus status = traverseToFarEnds(*this, ctx, op, {assocClass, resultClass, role, resultRole},
+                                                [&](const CmpiObjectPath &far) { farEnds.push_back(far); });
+    if (status.rc() == CMPI_RC_OK) {
+        for (const CmpiInstance &instance : fetchFarEnds(broker, ctx, farEnds, properties)) rslt.returnData(instance);
+    }
+    return finish(rslt, status);
 }
 
 CmpiStatus SimpleAssociationMI::associatorNames(const CmpiContext &ctx, CmpiResult &rslt,
                                                 const CmpiObjectPath &op, const char *assocClass,
                                                 const char *resultClass, const char *role,
                                                 const char *resultRole) {
-    return traverseToFarEnds(*this, ctx, rslt, op, {assocClass, resultClass, role, resultRole},
-                             [&](const CmpiObjectPath &far) { rslt.returnData(far); });
+    return finish(rslt, traverseToFarEnds(*this, ctx, op, {assocClass, resultClass, role, resultRole},
+                                          [&](const CmpiObjectPath &far) { rslt.returnData(far); }));
 }
 
 CmpiStatus SimpleAssociationMI::references(const CmpiContext &ctx, CmpiResult &rslt,
                                            const CmpiObjectPath &op, const char *resultClass,
                                            const char *role, const char **properties) {
-    return traverse(*this, ctx, rslt, op, {resultClass, nullptr, role, nullptr}, properties,
-                    [&](const CmpiInstance &association, const std::vector<AssociationEnd> &) {
-                        rslt.returnData(association);
-                    });
+    return finish(rslt, traverse(*this, ctx, op, {resultClass, nullptr, role, nullptr}, properties,
+                                 [&](const CmpiInstance &association, const std::vector<AssociationEnd> &) {
+                                     rslt.returnData(association);
+                                 }));
 }
 
 CmpiStatus SimpleAssociationMI::referenceNames(const CmpiContext &ctx, CmpiResult &rslt,
                                                const CmpiObjectPath &op, const char *resultClass,
                                                const char *role) {
-    return traverse(*this, ctx, rslt, op, {resultClass, nullptr, role, nullptr}, nullptr,
-                    [&](const CmpiInstance &association, const std::vector<AssociationEnd> &) {
-                        rslt.returnData(association.getObjectPath());
-                    });
+    return finish(rslt, traverse(*this, ctx, op, {resultClass, nullptr, role, nullptr}, nullptr,
+                                 [&](const CmpiInstance &association, const std::vector<AssociationEnd> &) {
+                                     rslt.returnData(association.getObjectPath());
+                                 }));
 }
 
 }  // namespace OMC

@@ -32,9 +32,10 @@ public:
 
     // The objects at the far ends: every reference other than the source's
     // whose role matches `resultRole` and whose class is or derives from
-    // `resultClass`, fetched through the broker with the property list. A
-    // far end the broker cannot fetch (not found, or its provider failing)
-    // is left out rather than failing the whole answer.
+    // `resultClass`, fetched through the broker with the property list by
+    // enumerating their classes (fetchFarEnds), never by getInstance. A far
+    // end the broker cannot fetch (no such instance, or its provider
+    // failing) is left out rather than failing the whole answer.
     CmpiStatus associators(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
                            const char *assocClass, const char *resultClass, const char *role,
                            const char *resultRole, const char **properties) override;

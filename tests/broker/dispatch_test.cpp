@@ -44,6 +44,12 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
         {"associatorNames failing in an up-call",
          [&] { return broker.associatorNames(widget("x"), "", "", "", ""); }, CMPI_RC_ERR_NOT_FOUND,
          Optional(std::string("no widget x"))},
+        {"getInstance answered OK with nothing, as sfcb tells a client",
+         [&] { return broker.getInstance(widget("vanishing"), std::nullopt); }, CMPI_RC_ERR_NOT_FOUND, _},
+        {"a subscription to a class sfcb does not forward",
+         [&] { return broker.activateFilter(kNs, "CIM_Indication", "SELECT * FROM CIM_Indication", true); },
+         CMPI_RC_ERR_NOT_SUPPORTED,
+         Optional(std::string("No supported indication classes in filter query or no provider found"))},
     };
     for (const Case &c : cases) {
         SCOPED_TRACE(c.request);
@@ -51,6 +57,14 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
         EXPECT_EQ(response.rc, c.rc);
         EXPECT_THAT(response.message, c.message);
     }
+}
+
+// sfcb takes the first answer of an up-call getInstance unseen, and its
+// provider process dies when the answer is OK with nothing.
+using BrokerDeathTest = BrokerTest;
+TEST_F(BrokerDeathTest, AnUpCallGetInstanceAnsweredOkWithNothingEndsTheProcess) {
+    GTEST_FLAG_SET(death_test_style, "threadsafe");
+    EXPECT_DEATH(broker.getInstance(gadget("vanishing"), std::nullopt), "answered OK without an instance");
 }
 
 TEST_F(BrokerTest, RequestsFreeTheBrokerObjectsTheyMake) {

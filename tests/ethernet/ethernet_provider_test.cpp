@@ -1,6 +1,8 @@
 // The Ethernet port provider as a client sees it through the broker: its
 // factories, its failure statuses, the port, identity and association
 // instances built from the inventory, and lookups by key.
+#include <gmock/gmock.h>
+
 #include "EthernetBroker.h"
 #include "model/CimTypes.h"
 
@@ -98,21 +100,28 @@ TEST_F(EthernetBroker, AnEmptyHostAnswersEveryClassWithNothing) {
     }
 }
 
-// Every property in the order set, as a client shows it; the types after,
-// since MOF text does not tell how wide an integer is.
+// Every property as a client of sfcb shows it: the class's defaults and the
+// key of the provider's path first, then the rest in the order set; the
+// path is made of the class's keys. The types after, since MOF text does
+// not tell how wide an integer is.
 TEST_F(EthernetBroker, PortInstanceCarriesEveryPropertyWithItsType) {
     serve(twoAdapterProfile());
     const Response response = broker->enumInstances(classPath("Talvex_EthernetPort"), std::nullopt);
     ASSERT_TRUE(response.ok()) << response.message.value_or("");
     ASSERT_EQ(response.instances.size(), 2u);
     const Instance &nic0 = response.instances[0];
-    EXPECT_EQ(formatInstanceMof(nic0), R"(// root/cimv2:Talvex_EthernetPort.DeviceID="nic0"
+    EXPECT_EQ(formatInstanceMof(nic0), R"(// root/cimv2:Talvex_EthernetPort.SystemCreationClassName="OMC_UnitaryComputerSystem",SystemName=")" +
+                                           hostName + R"(",CreationClassName="Talvex_EthernetPort",DeviceID="nic0"
 instance of Talvex_EthernetPort
 {
+    EnabledState = 2;
+    RequestedState = 5;
+    EnabledDefault = 2;
+    TransitioningToState = 12;
+    DeviceID = "nic0";
     SystemCreationClassName = "OMC_UnitaryComputerSystem";
     SystemName = ")" + hostName + R"(";
     CreationClassName = "Talvex_EthernetPort";
-    DeviceID = "nic0";
     Name = "nic0";
     ElementName = "nic0";
     PortType = 0;
@@ -122,8 +131,6 @@ instance of Talvex_EthernetPort
     LinkTechnology = 2;
     PermanentAddress = "021B210A0B0C";
     NetworkAddresses = {"021B210A0B0C"};
-    RequestedState = 5;
-    EnabledState = 2;
     OperationalStatus = {2};
     Capabilities = {5};
     EnabledCapabilities = {0};
@@ -137,8 +144,8 @@ instance of Talvex_EthernetPort
     for (const NamedValue &property : nic0.properties) {
         types += cimTypeName(property.value.elementType()) + (property.value.isArray() ? "[] " : " ");
     }
-    EXPECT_EQ(types, "string string string string string string uint16 uint16 string uint64 uint16 string string[] "
-                     "uint16 uint16 uint16[] uint16[] uint16[] boolean uint64 string[] string[] ");
+    EXPECT_EQ(types, "uint16 uint16 uint16 uint16 string string string string string string uint16 uint16 string "
+                     "uint64 uint16 string string[] uint16[] uint16[] uint16[] boolean uint64 string[] string[] ");
     const auto nic1 = literals(response.instances[1]);
     EXPECT_EQ(nic1.at("EnabledState"), "3");
     EXPECT_EQ(nic1.at("OperationalStatus"), "{10}");
@@ -168,19 +175,24 @@ TEST_F(EthernetBroker, IdentitiesAndElementsOfEachAdapter) {
     const Response elements =
         broker->enumInstances(classPath("Talvex_EPFirmwareElementSoftwareIdentity"), std::nullopt);
     ASSERT_EQ(elements.instances.size(), 2u);
-    EXPECT_EQ(formatPath(elements.instances[1].path), "root/cimv2:Talvex_EPFirmwareElementSoftwareIdentity");
+    EXPECT_EQ(elements.instances[1].path.keys.size(), 2u) << "a client's path is made of both references";
     EXPECT_EQ(referenceText(elements.instances[1], "Dependent"), formatPath(portPath("nic1")));
     EXPECT_EQ(referenceText(elements.instances[1], "Antecedent"),
               "root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1\"");
     EXPECT_EQ(literals(elements.instances[1]).at("ElementSoftwareStatus"), "{2}");
 }
 
+// The filter keeps out what the provider sets later; the class's defaults
+// and the key of the provider's path are there before it, as in sfcb.
 TEST_F(EthernetBroker, PropertyListFiltersPortsOnly) {
     serve(twoAdapterProfile());
     const PropertyList speedOnly = std::vector<std::string>{"Speed"};
     const Response ports = broker->enumInstances(classPath("Talvex_EthernetPort"), speedOnly);
     ASSERT_EQ(ports.instances.size(), 2u);
-    EXPECT_EQ(literals(ports.instances[0]).size(), 1u);
+    EXPECT_THAT(literals(ports.instances[0]),
+                testing::UnorderedElementsAre(testing::Key("Speed"), testing::Key("DeviceID"), testing::Key("EnabledState"),
+                                              testing::Key("RequestedState"), testing::Key("EnabledDefault"),
+                                              testing::Key("TransitioningToState")));
     const Response drivers = broker->enumInstances(classPath("Talvex_EPDriverSoftwareIdentity"), speedOnly);
     ASSERT_EQ(drivers.instances.size(), 2u);
     EXPECT_EQ(literals(drivers.instances[0]).size(), 3u);
@@ -189,15 +201,19 @@ TEST_F(EthernetBroker, PropertyListFiltersPortsOnly) {
 // Lookups by the names the provider gives are the consistency suite's.
 TEST_F(EthernetBroker, LookupsMatchAdapterNamesWithoutRegardToCase) {
     serve(twoAdapterProfile());
+    // A port's path as a client sees it: the class's keys in their order.
+    const auto clientPortText = [&](const char *deviceId) {
+        return "root/cimv2:Talvex_EthernetPort.SystemCreationClassName=\"OMC_UnitaryComputerSystem\",SystemName=\"" +
+               hostName + "\",CreationClassName=\"Talvex_EthernetPort\",DeviceID=\"" + deviceId + "\"";
+    };
     const struct {
         const char *what;
         ObjectPath path;
         std::vector<std::string> found;
     } cases[] = {
-        {"port by upper-case name", portPath("NIC0"), {"root/cimv2:Talvex_EthernetPort.DeviceID=\"nic0\""}},
+        {"port by upper-case name", portPath("NIC0"), {clientPortText("nic0")}},
         {"class in other case", ObjectPath{"", kNs, "TALVEX_ethernetport", {{"DeviceID", CimValue::makeString("nic1")}}},
-         {"root/cimv2:Talvex_EthernetPort.DeviceID=\"nic1\""}},
-        {"port that does not exist", portPath("nic7"), {}},
+         {clientPortText("nic1")}},
         {"whatever precedes the last colon", identityPath("Talvex_EPFirmwareSoftwareIdentity", "x:NIC1"),
          {"root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1\""}},
         {"InstanceID without colon", identityPath("Talvex_EPDriverSoftwareIdentity", "nic0"),
@@ -208,6 +224,8 @@ TEST_F(EthernetBroker, LookupsMatchAdapterNamesWithoutRegardToCase) {
         EXPECT_EQ(response.rc, CMPI_RC_OK) << c.what;
         EXPECT_EQ(pathTexts(response), c.found) << c.what;
     }
+    // The provider answers OK with nothing; sfcb tells the client so.
+    EXPECT_EQ(broker->getInstance(portPath("nic7"), std::nullopt).rc, CMPI_RC_ERR_NOT_FOUND);
     const Response names = broker->enumInstanceNames(classPath("talvex_ethernetport"));
     ASSERT_EQ(names.paths.size(), 2u);
     EXPECT_EQ(names.paths[0].className, "Talvex_EthernetPort");

@@ -99,7 +99,10 @@ TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {
         {referencing, alpha, {"", "", "Dependent", ""}, {}},
         {referencing, disk0, {"", "", "Dependent", ""},
          {ofAlpha[0], link("Test_HostedDevice", "beta", "Test_Disk", "disk0")}},
-        {{associators, associatorNames}, echo, echoed, {system("Test_HostedDevice Test_System Dependent Antecedent")}},
+        {{associatorNames}, echo, echoed, {system("Test_HostedDevice Test_System Dependent Antecedent")}},
+        // Only far ends that exist are fetched, whether the source exists or not.
+        {{associators}, echo, echoed, {}},
+        {{associators}, ghost, {"", "", "", ""}, {alpha}},
         // The reference operations pass their result class as the association class.
         {referencing, echo, echoed,
          {link("Test_HostedDevice", "Test_HostedDevice (null) Dependent (null)", "Test_Device", "echo")}},

@@ -12,6 +12,8 @@ namespace testprovider {
 inline constexpr const char *kWidgetClass = "Test_Widget";
 inline constexpr const char *kGadgetClass = "Test_Gadget";
 inline constexpr const char *kGadgetPrefix = "gadget-";
+// The widget whose getInstance answers OK with nothing.
+inline constexpr const char *kVanishingWidget = "vanishing";
 
 // The text of a string key; a missing or null key is the caller's mistake.
 inline std::string stringKey(const CmpiObjectPath &path, const char *key) {

@@ -41,17 +41,17 @@ INSTANTIATE_TEST_SUITE_P(
     testing::Values(
         OutputCase{"GetInstanceWithPropertyList", {"--properties", "Tags", "gi", kAlpha},
                    "// " + std::string(kAlpha) +
-                       "\ninstance of Test_Widget\n{\n    Tags = {\"test\", \"alpha\"};\n};\n\n"},
+                       "\ninstance of Test_Widget\n{\n    Name = \"alpha\";\n    Tags = {\"test\", \"alpha\"};\n};\n\n"},
         OutputCase{"Enumerate", {"--properties", "Size,Enabled", "ei", "Test_SpecialWidget"},
                    "// root/cimv2:Test_SpecialWidget.Name=\"gamma\"\ninstance of Test_SpecialWidget\n{\n"
-                   "    Size = 3;\n    Enabled = TRUE;\n};\n\n"},
+                   "    Name = \"gamma\";\n    Size = 3;\n    Enabled = TRUE;\n};\n\n"},
         OutputCase{"EnumerateSubclassInOtherSpelling", {"ein", "root/cimv2:test_specialwidget"},
                    "root/cimv2:Test_SpecialWidget.Name=\"gamma\"\n"},
         OutputCase{"AssociatorNames", {"ain", kGadgetAlpha}, std::string(kAlpha) + "\n"},
         OutputCase{"AssociatorsWithPropertyList",
                    {"--properties", "WidgetName", "ai", kAlpha},
                    "// root/cimv2:Test_Gadget.Id=\"gadget-alpha\"\ninstance of Test_Gadget\n{\n"
-                   "    WidgetName = \"alpha\";\n};\n\n"},
+                   "    Id = \"gadget-alpha\";\n    WidgetName = \"alpha\";\n};\n\n"},
         OutputCase{"ReferenceNames", {"rin", kGadgetAlpha}, kLinkAlpha + "\n"},
         OutputCase{"References",
                    {"ri", kAlpha},
@@ -111,7 +111,8 @@ INSTANTIATE_TEST_SUITE_P(
                        R"(,"namespace":"root/cimv2","className":"Test_WidgetGadget","keys":{
                        "Owner":{"type":"reference","value":$ALPHA},
                        "Part":{"type":"reference","value":$GADGET}}},
-                       "properties":{"Part":{"type":"reference","value":$GADGET}}})"}),
+                       "properties":{"Owner":{"type":"reference","value":$ALPHA},
+                       "Part":{"type":"reference","value":$GADGET}}})"}),
     [](const auto &test) { return std::string(test.param.name); });
 
 // Which sections the demo shows, and in what order, is checked in the JSON

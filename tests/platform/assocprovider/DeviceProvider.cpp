@@ -4,7 +4,8 @@
 // association class for all its answers; unlike them it ignores every filter,
 // so the tests see the filtering the base does. Every reference is rebuilt
 // without a namespace, not copied from the request, so the base must
-// recognise the source end. Any system name exists; devices are those listed.
+// recognise the source end. The systems and devices listed exist; a link
+// may name one that does not.
 #include <algorithm>
 #include <iterator>
 #include <string>
@@ -15,7 +16,14 @@
 
 namespace {
 
-constexpr const char *kDevices[] = {"disk0", "nic0", "disk1"};
+constexpr const char *kSystems[] = {"alpha", "beta"};
+
+struct Device {
+    const char *className;
+    const char *name;
+};
+
+constexpr Device kDevices[] = {{"Test_Disk", "disk0"}, {"Test_Device", "nic0"}, {"Test_Disk", "disk1"}};
 
 struct Link {
     const char *assocClass;
@@ -53,28 +61,51 @@ std::string stringKey(const CmpiObjectPath &path, const char *key) {
     return static_cast<const char *>(value);
 }
 
+const char *keyOf(const CmpiObjectPath &path) { return path.classPathIsA("Test_System") ? "Name" : "DeviceID"; }
+
+CmpiInstance instanceOf(const CmpiObjectPath &classPath, const std::string &name, const char **properties) {
+    const char *key = keyOf(classPath);
+    CmpiObjectPath path(classPath.getNameSpace(), classPath.getClassName().charPtr());
+    path.setKey(key, name.c_str());
+    CmpiInstance instance(path);
+    const char *keys[] = {key, nullptr};
+    instance.setPropertyFilter(properties, keys);
+    instance.setProperty(key, name.c_str());
+    if (!classPath.classPathIsA("Test_System")) {
+        instance.setProperty("Model", "Kestrel");
+        instance.setProperty("Size", CMPIUint32(500));
+    }
+    return instance;
+}
+
 class DeviceProvider : public CmpiInstanceMI, public OMC::SimpleAssociationMI {
 public:
     DeviceProvider(const CmpiBroker &mb, const CmpiContext &ctx)
         : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), SimpleAssociationMI(mb, ctx) {}
 
+    // The broker asks once per registered class, naming it in `cop`.
+    CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
+                             const char **properties) override {
+        const CmpiString className = cop.getClassName();
+        if (className.equalsIgnoreCase("Test_System")) {
+            for (const char *name : kSystems) rslt.returnData(instanceOf(cop, name, properties));
+        }
+        for (const Device &device : kDevices) {
+            if (className.equalsIgnoreCase(device.className)) rslt.returnData(instanceOf(cop, device.name, properties));
+        }
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
     CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                            const char **properties) override {
-        const bool isSystem = cop.classPathIsA("Test_System");
-        const char *key = isSystem ? "Name" : "DeviceID";
-        const std::string name = stringKey(cop, key);
-        if (!isSystem && std::find(std::begin(kDevices), std::end(kDevices), name) == std::end(kDevices)) {
-            return CmpiStatus(CMPI_RC_ERR_NOT_FOUND, name.c_str());
-        }
-        CmpiInstance instance(cop);
-        const char *keys[] = {key, nullptr};
-        instance.setPropertyFilter(properties, keys);
-        instance.setProperty(key, name.c_str());
-        if (!isSystem) {
-            instance.setProperty("Model", "Kestrel");
-            instance.setProperty("Size", CMPIUint32(500));
-        }
-        rslt.returnData(instance);
+        const std::string name = stringKey(cop, keyOf(cop));
+        const bool known = cop.classPathIsA("Test_System")
+                               ? std::find(std::begin(kSystems), std::end(kSystems), name) != std::end(kSystems)
+                               : std::any_of(std::begin(kDevices), std::end(kDevices),
+                                             [&](const Device &device) { return name == device.name; });
+        if (!known) return CmpiStatus(CMPI_RC_ERR_NOT_FOUND, name.c_str());
+        rslt.returnData(instanceOf(cop, name, properties));
         rslt.returnDone();
         return CmpiStatus(CMPI_RC_OK);
     }

@@ -1,0 +1,116 @@
+#include "platform/OmcFarEnds.h"
+
+#include <algorithm>
+#include <cctype>
+#include <string>
+#include <unordered_map>
+#include <utility>
+
+#include "CmpiStatus.h"
+#include "platform/OmcObjectIdentity.h"
+
+namespace OMC {
+
+namespace {
+
+std::string lowered(const char *text) {
+    std::string out = text != nullptr ? text : "";
+    std::transform(out.begin(), out.end(), out.begin(),
+                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    return out;
+}
+
+// The string keys of a path, names lowered and sorted. Paths that name the
+// same object (sameObject) have the same text keys, so this buckets them
+// and sameObject decides within a bucket.
+std::string textKeySignature(const CmpiObjectPath &path) {
+    std::vector<std::pair<std::string, std::string>> keys;
+    for (unsigned int index = 0, count = path.getKeyCount(); index < count; ++index) {
+        CmpiString name;
+        const CmpiData value = path.getKey(index, &name);
+        if (value.type() == CMPI_string && !value.isNullValue()) {
+            keys.emplace_back(lowered(name.charPtr()), static_cast<const char *>(value));
+        }
+    }
+    std::sort(keys.begin(), keys.end());
+    std::string signature;
+    for (const auto &key : keys) signature += key.first + '\0' + key.second + '\0';
+    return signature;
+}
+
+// The request's property list with the key names of `path` added; null
+// stays null (every property).
+class WantedProperties {
+public:
+    WantedProperties(const char **properties, const CmpiObjectPath &path) : all(properties == nullptr) {
+        if (all) return;
+        for (const char **name = properties; *name != nullptr; ++name) names.emplace_back(*name);
+        for (unsigned int index = 0, count = path.getKeyCount(); index < count; ++index) {
+            CmpiString name;
+            path.getKey(index, &name);
+            if (!name.isNull()) names.emplace_back(name.charPtr());
+        }
+        for (const std::string &name : names) pointers.push_back(name.c_str());
+        pointers.push_back(nullptr);
+    }
+
+    const char **list() { return all ? nullptr : pointers.data(); }
+
+private:
+    bool all;
+    std::vector<std::string> names;
+    std::vector<const char *> pointers;
+};
+
+// Fills `found` for the far ends listed in `members`, all of one class, from
+// one enumeration of that class.
+void fetchClass(const CmpiBroker &broker, const CmpiContext &ctx, const std::vector<CmpiObjectPath> &farEnds,
+                const std::vector<std::size_t> &members, const char **properties,
+                std::vector<CmpiInstance> &found) {
+    const CmpiObjectPath &sample = farEnds[members.front()];
+    std::unordered_map<std::string, std::vector<std::size_t>> bySignature;
+    for (std::size_t member : members) bySignature[textKeySignature(farEnds[member])].push_back(member);
+    WantedProperties wanted(properties, sample);
+    CmpiEnumeration instances;
+    try {
+        instances = broker.enumInstances(ctx, CmpiObjectPath(sample.getNameSpace(), sample.getClassName().charPtr()),
+                                         wanted.list());
+    } catch (const CmpiStatus &) {
+        return;
+    }
+    while (instances.hasNext()) {
+        const CmpiInstance instance = instances.getNext();
+        const CmpiObjectPath path = instance.getObjectPath();
+        const auto bucket = bySignature.find(textKeySignature(path));
+        if (bucket == bySignature.end()) continue;
+        for (std::size_t member : bucket->second) {
+            if (found[member].isNull() && sameObject(path, farEnds[member])) found[member] = instance;
+        }
+    }
+}
+
+}  // namespace
+
+std::vector<CmpiInstance> fetchFarEnds(const CmpiBroker &broker, const CmpiContext &ctx,
+                                       const std::vector<CmpiObjectPath> &farEnds,
+                                       const char **properties) {
+    std::vector<CmpiInstance> found(farEnds.size());
+    std::vector<bool> grouped(farEnds.size(), false);
+    for (std::size_t first = 0; first < farEnds.size(); ++first) {
+        if (grouped[first]) continue;
+        const CmpiString className = farEnds[first].getClassName();
+        std::vector<std::size_t> members;
+        for (std::size_t other = first; other < farEnds.size(); ++other) {
+            if (!grouped[other] && farEnds[other].getClassName().equalsIgnoreCase(className)) {
+                grouped[other] = true;
+                members.push_back(other);
+            }
+        }
+        fetchClass(broker, ctx, farEnds, members, properties, found);
+    }
+    found.erase(std::remove_if(found.begin(), found.end(), [](const CmpiInstance &instance) { return instance.isNull(); }),
+                found.end());
+    return found;
+}
+
+}  // namespace OMC
