@@ -79,9 +79,26 @@ private:
             for (const std::string &word : words(value)) setType(word);
         } else if (equalsIgnoreCase(key, "namespace")) {
             for (const std::string &word : words(value)) current_.namespaces.push_back(word);
-        } else if (!equalsIgnoreCase(key, "group") && !equalsIgnoreCase(key, "unload")) {
+        } else if (equalsIgnoreCase(key, "group")) {
+            setGroup(value);
+        } else if (equalsIgnoreCase(key, "unload")) {
+            setUnload(value);
+        } else {
             fail(line_, "unknown key '" + key + "'");
         }
+    }
+
+    // sfcb would take the first of several words and silently drop the rest.
+    void setGroup(const std::string &value) {
+        if (words(value).size() != 1) fail(line_, "group takes one name, not '" + value + "'");
+        current_.group = value;
+    }
+
+    // sfcb knows no other value and compares it case-sensitively; how long an
+    // idle provider stays is sfcb.cfg's providerTimeoutInterval.
+    void setUnload(const std::string &value) {
+        if (value != "never") fail(line_, "unload takes only 'never', not '" + value + "'");
+        current_.unloadNever = true;
     }
 
     void setType(const std::string &word) {

@@ -16,11 +16,17 @@ struct ProviderRegistration {
     bool indication = false;
     bool method = false;
     std::vector<std::string> namespaces;
+    // Providers naming the same group run in one process under sfcb; empty
+    // when the block names none.
+    std::string group;
+    // "unload: never": sfcb keeps the provider loaded however long it idles.
+    bool unloadNever = false;
 };
 
 // Throws std::runtime_error "origin:line: message" for a malformed line, an
-// unknown key or type, a block lacking provider, location, type or namespace,
-// and a class registered twice.
+// unknown key or type, a group that is not one name, an unload other than
+// "never", a block lacking provider, location, type or namespace, and a
+// class registered twice.
 std::vector<ProviderRegistration> parseRegistration(const std::string &text, const std::string &origin);
 
 // As parseRegistration with the path as origin; throws "cannot read <path>".

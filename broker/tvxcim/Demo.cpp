@@ -22,7 +22,8 @@ constexpr double kFirstIndicationSeconds = 10;
 ObjectPath classPath(const std::string &className) { return ObjectPath{"", defaultNameSpace, className, {}}; }
 
 // Waits for the first indication of the class, with the subscription made
-// the way sfcb makes it.
+// the way sfcb makes it. The subscription is removed before anything is
+// written, so that no request runs while output is held back.
 void showFirstIndication(Broker &broker, const std::string &indicationClass, double seconds,
                          ResultWriter &writer) {
     std::mutex mutex;
@@ -36,21 +37,31 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
         }
         return true;
     });
-    const ClassSubscription subscription(broker, indicationClass);
-    std::unique_lock<std::mutex> lock(mutex);
-    if (subscription.response().ok()) {
-        arrived.wait_for(lock, std::chrono::duration<double>(seconds), [&] { return first.has_value(); });
+    Response setup;
+    {
+        const ClassSubscription subscription(broker, indicationClass);
+        setup = subscription.response();
+        std::unique_lock<std::mutex> lock(mutex);
+        if (setup.ok()) {
+            arrived.wait_for(lock, std::chrono::duration<double>(seconds), [&] { return first.has_value(); });
+        }
     }
-    writer.firstIndication(indicationClass, subscription.response(), first, seconds);
+    const std::lock_guard<std::mutex> lock(mutex);
+    writer.firstIndication(indicationClass, setup, first, seconds);
 }
 
 }  // namespace
 
+// Providers write to standard error while a request runs (an instance
+// factory announces itself, for one), so what the demo has written is handed
+// on before each request: with both streams in one file, a provider's line
+// then never lands inside one of the demo's.
 void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
     std::set<std::string> shown;
     std::vector<ObjectPath> firstOfEachClass;
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (!registration.instance || !shown.insert(registration.className).second) continue;
+        writer.flush();
         const Response response = broker.enumInstances(classPath(registration.className), line.properties);
         writer.enumeration(registration.className, response);
         if (response.ok() && !response.instances.empty() &&
@@ -59,12 +70,14 @@ void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
         }
     }
     for (const ObjectPath &path : firstOfEachClass) {
+        writer.flush();
         const Response response = broker.associatorNames(path, "", "", "", "");
         if (response.ok() && !response.paths.empty()) writer.associatorNames(path, response.paths);
     }
     shown.clear();
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.indication && shown.insert(registration.className).second) {
+            writer.flush();
             showFirstIndication(broker, registration.className, line.seconds.value_or(kFirstIndicationSeconds),
                                 writer);
         }

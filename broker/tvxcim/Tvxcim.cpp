@@ -51,6 +51,8 @@ void serve(const CommandLine &line, std::ostream &out, BrokerReports &reports) {
     tvxbroker::Broker broker(std::move(config));
     const std::unique_ptr<ResultWriter> writer = line.json ? makeJsonWriter(out) : makeMofWriter(out);
     runCommand(broker, line, *writer);
+    // Providers may still write to standard error as they are cleaned up.
+    writer->flush();
     broker.shutdown();
 }
 

@@ -32,10 +32,13 @@ TEST(ProviderRegistration, ReadsBlocks) {
     EXPECT_EQ(disk.location, "tvxdisk");
     EXPECT_TRUE(disk.instance && disk.method);
     EXPECT_EQ(disk.namespaces, (std::vector<std::string>{"root/cimv2", "root/interop"}));
+    EXPECT_EQ(disk.group, "tvx");
+    EXPECT_TRUE(disk.unloadNever);
     const ProviderRegistration &link = regs[1];
     EXPECT_EQ(link.location, "tvxlink");
     EXPECT_TRUE(link.association && link.indication);
-    EXPECT_FALSE(link.instance || link.method);
+    EXPECT_FALSE(link.instance || link.method || link.unloadNever);
+    EXPECT_EQ(link.group, "");
     EXPECT_TRUE(parseRegistration("", "empty").empty());
 }
 
@@ -46,6 +49,11 @@ TEST(ProviderRegistration, ErrorsNameTheLine) {
         {"[C]\n provider P\n", "reg:2: expected 'key: value'"},
         {"[C]\n vendor: x\n", "reg:2: unknown key 'vendor'"},
         {"[C]\n type: instance query\n", "reg:2: unknown provider type 'query'"},
+        {"[C]\n group:\n", "reg:2: group takes one name, not ''"},
+        {"[C]\n group: tvx heartbeat\n", "reg:2: group takes one name, not 'tvx heartbeat'"},
+        {"[C]\n unload: 60\n", "reg:2: unload takes only 'never', not '60'"},
+        {"[C]\n unload: Never\n", "reg:2: unload takes only 'never', not 'Never'"},
+        {"[C]\n unload:\n", "reg:2: unload takes only 'never', not ''"},
         {"[C]\n location: l\n type: instance\n namespace: n\n", "reg:1: block [C] has no provider"},
         {"[C]\n provider: P\n type: instance\n namespace: n\n", "reg:1: block [C] has no location"},
         {"[C]\n provider: P\n location: l\n type:\n namespace: n\n", "reg:1: block [C] has no type"},

@@ -1,12 +1,27 @@
-# Runs `tvxcim demo` on the built-in host as a user would and checks that
-# what it shows is the default host's ports, identities and associations,
+# Runs `tvxcim demo` on the built-in host as a user would, both streams to
+# one file (`tvxcim demo > log 2>&1`), and checks that each line the instance
+# factories write to standard error stands on its own line, and that what
+# the demo shows is the default host's ports, identities and associations,
 # its two processor packages, and at the end this host's first heartbeat.
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
+set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
 execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
-                RESULT_VARIABLE status OUTPUT_VARIABLE shown ERROR_VARIABLE errors)
+                RESULT_VARIABLE status OUTPUT_FILE "${log}" ERROR_FILE "${log}")
+file(READ "${log}" shown)
 if(NOT status EQUAL 0)
-  message(FATAL_ERROR "tvxcim demo exited with ${status}:\n${errors}")
+  message(FATAL_ERROR "tvxcim demo exited with ${status}:\n${shown}")
 endif()
+set(announcement "--- _Create_InstanceMI() P10CmpiBaseMI")
+string(REGEX MATCHALL "[^\n]*--- _Create_InstanceMI[^\n]*" announcements "${shown}")
+if(announcements STREQUAL "")
+  message(FATAL_ERROR "no instance factory announced itself:\n${shown}")
+endif()
+foreach(line IN LISTS announcements)
+  if(NOT line STREQUAL announcement)
+    message(FATAL_ERROR "a factory's line shares a line with tvxcim's output: '${line}'")
+  endif()
+endforeach()
+string(REPLACE "${announcement}\n" "" shown "${shown}")
 set(expected
   "DeviceID = \"vmnic0\";"
   "DeviceID = \"vmnic1\";\n[^}]*EnabledState = 3;"

@@ -8,6 +8,9 @@
 class CmpiAssociationMI : public virtual CmpiBaseMI {
 public:
     CmpiAssociationMI(const CmpiBroker &broker, const CmpiContext &ctx);
+    // First among the virtual functions, so that a provider's slots begin
+    // with the destructor pair (complete, deleting) and then the operations.
+    ~CmpiAssociationMI() override = default;
 
     virtual CmpiStatus associators(const CmpiContext &ctx, CmpiResult &rslt,
                                    const CmpiObjectPath &op, const char *assocClass,

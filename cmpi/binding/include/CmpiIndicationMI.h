@@ -8,6 +8,9 @@
 class CmpiIndicationMI : public virtual CmpiBaseMI {
 public:
     CmpiIndicationMI(const CmpiBroker &broker, const CmpiContext &ctx);
+    // First among the virtual functions, so that a provider's slots begin
+    // with the destructor pair (complete, deleting) and then the operations.
+    ~CmpiIndicationMI() override = default;
 
     virtual CmpiStatus authorizeFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
                                        const char *className, const CmpiObjectPath &op,

@@ -8,6 +8,9 @@
 class CmpiInstanceMI : public virtual CmpiBaseMI {
 public:
     CmpiInstanceMI(const CmpiBroker &broker, const CmpiContext &ctx);
+    // First among the virtual functions, so that a provider's slots begin
+    // with the destructor pair (complete, deleting) and then the operations.
+    ~CmpiInstanceMI() override = default;
 
     virtual CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
                                          const CmpiObjectPath &cop);
