@@ -31,7 +31,8 @@ set(expected
   "instance of Talvex_EPFirmwareElementSoftwareIdentity"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-0\";[^}]*Vendor = 2;"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-1\";[^}]*Vendor = 3;"
-  "== ain root/cimv2:Talvex_EthernetPort.DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity")
+  "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
+  "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"")
 foreach(pattern IN LISTS expected)
   if(NOT shown MATCHES "${pattern}")
     message(FATAL_ERROR "tvxcim demo did not show '${pattern}':\n${shown}")
