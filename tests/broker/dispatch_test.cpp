@@ -63,7 +63,6 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
 // provider process dies when the answer is OK with nothing.
 using BrokerDeathTest = BrokerTest;
 TEST_F(BrokerDeathTest, AnUpCallGetInstanceAnsweredOkWithNothingEndsTheProcess) {
-    GTEST_FLAG_SET(death_test_style, "threadsafe");
     EXPECT_DEATH(broker.getInstance(gadget("vanishing"), std::nullopt), "answered OK without an instance");
 }
 
