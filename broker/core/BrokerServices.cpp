@@ -5,7 +5,6 @@
 #include "core/EncSupport.h"
 #include "core/Requests.h"
 
-
 namespace tvxbroker {
 
 namespace {

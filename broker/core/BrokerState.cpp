@@ -6,6 +6,7 @@
 #include <cstdio>
 
 #include "core/EncSupport.h"
+#include "model/InstanceOfClass.h"
 
 namespace tvxbroker {
 
@@ -172,6 +173,7 @@ void Broker::State::callProvider(
     CMPIContext *ctx = enc::newContext(requestContextEntries(nameSpace));
     EncResult result;
     enc::bindResult(result, response);
+    const std::size_t first = response.instances.size();
     try {
         const CMPIStatus status = call(mi, ctx, &result.cmpi);
         response.rc = status.rc;
@@ -179,6 +181,13 @@ void Broker::State::callProvider(
     } catch (...) {
         response.rc = CMPI_RC_ERR_FAILED;
         response.message = "provider " + provider + " let an exception escape through CMPI";
+    }
+    // However a provider built its instances, a client of sfcb gets each on
+    // the path its class's key properties make. Like sfcb, the broker leaves
+    // a property list to the providers' filters.
+    for (std::size_t index = first; index < response.instances.size(); ++index) {
+        Instance &instance = response.instances[index];
+        instance.path = pathFromClassKeys(instance, config.schema);
     }
 }
 

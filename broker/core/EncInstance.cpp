@@ -100,7 +100,7 @@ CMPIStatus setPropertyFilter(CMPIInstance *inst, const char **properties, const 
     }
     // As in sfcb, the filter keeps out later properties only: what the
     // instance already holds (its class defaults and the keys of its path)
-    // stays. The broker applies the client's property list on the way out.
+    // stays.
     instance->filter = std::move(names);
     return status(CMPI_RC_OK);
 }

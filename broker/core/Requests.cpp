@@ -4,7 +4,6 @@
 #include <iterator>
 
 #include "core/EncSupport.h"
-#include "model/InstanceOfClass.h"
 
 namespace tvxbroker::requests {
 
@@ -25,16 +24,6 @@ private:
 };
 
 const char *orNull(const std::string &text) { return text.empty() ? nullptr : text.c_str(); }
-
-// What a client receives of the instances a provider returned from `first`
-// on: each on the path its class's keys make. Like sfcb, the broker leaves
-// the property list to the providers' filters.
-void presentInstances(const Broker::State &state, Response &response, std::size_t first) {
-    for (std::size_t index = first; index < response.instances.size(); ++index) {
-        Instance &instance = response.instances[index];
-        instance.path = pathFromClassKeys(instance, state.config.schema);
-    }
-}
 
 bool servesNamespace(const ProviderRegistration &registration, const std::string &nameSpace) {
     for (const std::string &served : registration.namespaces) {
@@ -120,13 +109,11 @@ Response askInstanceProviders(Broker::State &state, const ObjectPath &path, bool
     for (const InstanceTarget &target : targets) {
         ObjectPath targetPath = path;
         targetPath.className = target.className;
-        const std::size_t first = response.instances.size();
         state.callProvider(target.provider, InterfaceKind::Instance, path.nameSpace, response,
                            [&](void *mi, const CMPIContext *ctx, const CMPIResult *rslt) {
                                return call(static_cast<CMPIInstanceMI *>(mi), ctx, rslt,
                                            enc::newObjectPath(targetPath));
                            });
-        presentInstances(state, response, first);
         if (!response.ok()) break;
     }
     return response;
@@ -215,7 +202,6 @@ Response association(Broker::State &state, AssociationCall call, const ObjectPat
         state, &ProviderRegistration::association, routingClass, path.nameSpace, true);
     CPropertyList list(properties);
     for (const std::string &provider : providers) {
-        const std::size_t first = response.instances.size();
         state.callProvider(
             provider, InterfaceKind::Association, path.nameSpace, response,
             [&](void *handle, const CMPIContext *ctx, const CMPIResult *rslt) {
@@ -239,7 +225,6 @@ Response association(Broker::State &state, AssociationCall call, const ObjectPat
                 }
                 return enc::status(CMPI_RC_ERR_NOT_SUPPORTED);
             });
-        presentInstances(state, response, first);
         if (!response.ok()) break;
     }
     return response;

@@ -1,13 +1,13 @@
 #include "model/MofClassReader.h"
 
-#include <cerrno>
-#include <cstdlib>
+#include <optional>
 #include <utility>
 
 #include "model/CimTypes.h"
 #include "model/CimDateTime.h"
 #include "model/CimValue.h"
 #include "model/MofLexer.h"
+#include "model/ValueText.h"
 
 namespace tvxbroker {
 
@@ -224,49 +224,29 @@ private:
 
     CimValue readLiteral(CMPIType type, const std::string &property) {
         const int line = token_.line;
-        const auto refuse = [&] { lexer_.fail(line, "default value of " + property + " does not fit its type"); };
         const bool negative = token_.isPunct('-');
         if (negative) advance();
         const MofToken literal = token_;
         advance();
-        CimValue value;
-        if (literal.kind == MofToken::Number) {
-            if (!numberValue(type, literal.text, negative, value)) refuse();
-        } else if (literal.kind == MofToken::String && !negative && (type == CMPI_string || type == CMPI_dateTime)) {
+        if (literal.kind == MofToken::String && !negative && (type == CMPI_string || type == CMPI_dateTime)) {
             std::string text = unescaped(literal.text);
             while (token_.kind == MofToken::String) {  // adjacent literals join
                 text += unescaped(token_.text);
                 advance();
             }
-            value = CimValue::makeString(std::move(text));
-            if (type == CMPI_dateTime) {
-                DateTime dateTime;
-                if (!parseCimDateTime(value.text, dateTime)) refuse();
-                value = CimValue::makeDateTime(dateTime);
-            }
-        } else if (type == CMPI_boolean && !negative && (literal.isWord("true") || literal.isWord("false"))) {
-            value = CimValue::makeBoolean(literal.isWord("true"));
-        } else {
-            refuse();
+            if (type == CMPI_string) return CimValue::makeString(std::move(text));
+            DateTime dateTime;
+            if (!parseCimDateTime(text, dateTime)) lexer_.fail(line, "default value of " + property + " is not a CIM datetime");
+            return CimValue::makeDateTime(dateTime);
         }
-        return value;
-    }
-
-    static bool numberValue(CMPIType type, const std::string &text, bool negative, CimValue &value) {
-        errno = 0;
-        char *end = nullptr;
-        if (type == CMPI_real32 || type == CMPI_real64) {
-            const double real = std::strtod(text.c_str(), &end);
-            value = CimValue::makeReal(type, negative ? -real : real);
-        } else if ((type & CMPI_SINT) == CMPI_SINT) {
-            const long long number = std::strtoll(text.c_str(), &end, 0);
-            value = CimValue::makeSigned(type, negative ? -number : number);
-        } else if ((type & CMPI_SINT) == CMPI_UINT && !negative) {
-            value = CimValue::makeUnsigned(type, std::strtoull(text.c_str(), &end, 0));
-        } else {
-            return false;
+        if (literal.kind != MofToken::Number && literal.kind != MofToken::Identifier) {
+            lexer_.fail(line, "default value of " + property + " does not fit its type");
         }
-        return errno == 0 && end != nullptr && *end == '\0';
+        std::string problem;
+        const std::optional<CimValue> value =
+            bareScalarValue(type, property, (negative ? "-" : "") + literal.text, problem);
+        if (!value) lexer_.fail(line, "default " + problem);
+        return *value;
     }
 
     static std::string unescaped(const std::string &literal) {

@@ -1,6 +1,6 @@
 #include "model/PathText.h"
 
-#include <charconv>
+#include <optional>
 
 #include "model/CimDateTime.h"
 #include "model/CimTypes.h"
@@ -146,33 +146,12 @@ private:
     }
 
     CimValue convertBare(const PropertyDecl &property, const std::string &value, std::size_t at) const {
-        const std::string &name = property.name;
-        const ValueKind kind = kindOf(property, at);
+        kindOf(property, at);
         if (equalsIgnoreCase(value, "NULL")) return CimValue::makeNull(property.type);
-        if (kind == ValueKind::Boolean) {
-            if (equalsIgnoreCase(value, "TRUE") || equalsIgnoreCase(value, "FALSE")) {
-                return CimValue::makeBoolean(equalsIgnoreCase(value, "TRUE"));
-            }
-            fail("value of " + name + " is not TRUE or FALSE", at);
-        }
-        if (kind == ValueKind::Real) {
-            double real = 0;
-            if (!readWhole(value, real)) fail("value of " + name + " is not a real number", at);
-            return CimValue::makeReal(property.type, real);
-        }
-        const unsigned bits = integerBits(property.type);
-        if (bits == 0) fail("value of " + name + " must be quoted", at);
-        if (kind == ValueKind::Unsigned) {
-            std::uint64_t number = 0;
-            if (!readWhole(value, number)) fail("value of " + name + " is not an unsigned integer", at);
-            if (bits < 64 && number >> bits) fail(outOfRange(property, value), at);
-            return CimValue::makeUnsigned(property.type, number);
-        }
-        std::int64_t number = 0;
-        if (!readWhole(value, number)) fail("value of " + name + " is not an integer", at);
-        const std::int64_t limit = bits < 64 ? std::int64_t(1) << (bits - 1) : 0;
-        if (bits < 64 && (number < -limit || number >= limit)) fail(outOfRange(property, value), at);
-        return CimValue::makeSigned(property.type, number);
+        std::string problem;
+        const std::optional<CimValue> scalar = bareScalarValue(property.type, property.name, value, problem);
+        if (!scalar) fail(problem, at);
+        return *scalar;
     }
 
     static ValueKind kindOf(const PropertyDecl &property, std::size_t at) {
@@ -181,17 +160,6 @@ private:
             fail("property " + property.name + " has a type that cannot appear in a path", at);
         }
         return kind;
-    }
-
-    static std::string outOfRange(const PropertyDecl &property, const std::string &value) {
-        return "value " + value + " of " + property.name + " is out of range for " + cimTypeName(property.type);
-    }
-
-    template <typename Number>
-    static bool readWhole(const std::string &text, Number &number) {
-        const char *end = text.data() + text.size();
-        const auto result = std::from_chars(text.data(), end, number);
-        return result.ec == std::errc() && result.ptr == end;
     }
 
     const std::string &text_;

@@ -8,6 +8,51 @@
 
 namespace tvxbroker {
 
+namespace {
+
+template <typename Number>
+bool readWhole(const std::string &text, Number &number) {
+    const char *end = text.data() + text.size();
+    const auto result = std::from_chars(text.data(), end, number);
+    return result.ec == std::errc() && result.ptr == end;
+}
+
+}  // namespace
+
+std::optional<CimValue> bareScalarValue(CMPIType type, const std::string &name, const std::string &text,
+                                        std::string &problem) {
+    const ValueKind kind = valueKind(type);
+    const auto refuse = [&](const std::string &why) {
+        problem = why;
+        return std::nullopt;
+    };
+    if (kind == ValueKind::Boolean) {
+        if (equalsIgnoreCase(text, "TRUE") || equalsIgnoreCase(text, "FALSE")) {
+            return CimValue::makeBoolean(equalsIgnoreCase(text, "TRUE"));
+        }
+        return refuse("value of " + name + " is not TRUE or FALSE");
+    }
+    if (kind == ValueKind::Real) {
+        double real = 0;
+        if (!readWhole(text, real)) return refuse("value of " + name + " is not a real number");
+        return CimValue::makeReal(type, real);
+    }
+    const unsigned bits = integerBits(type);
+    if (bits == 0) return refuse("value of " + name + " must be quoted");
+    const std::string outOfRange = "value " + text + " of " + name + " is out of range for " + cimTypeName(type);
+    if (kind == ValueKind::Unsigned) {
+        std::uint64_t number = 0;
+        if (!readWhole(text, number)) return refuse("value of " + name + " is not an unsigned integer");
+        if (bits < 64 && number >> bits) return refuse(outOfRange);
+        return CimValue::makeUnsigned(type, number);
+    }
+    std::int64_t number = 0;
+    if (!readWhole(text, number)) return refuse("value of " + name + " is not an integer");
+    const std::int64_t limit = bits < 64 ? std::int64_t(1) << (bits - 1) : 0;
+    if (bits < 64 && (number < -limit || number >= limit)) return refuse(outOfRange);
+    return CimValue::makeSigned(type, number);
+}
+
 bool scalarText(const CimValue &scalar, std::string &text, bool &quoted) {
     quoted = true;
     switch (valueKind(scalar.type)) {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <string>
 
 #include "model/CimValue.h"
@@ -13,6 +14,13 @@ namespace tvxbroker {
 // or embedded instance. Booleans are TRUE/FALSE, integers decimal and reals
 // in their shortest exact form. False for a type without a literal.
 bool scalarText(const CimValue &scalar, std::string &text, bool &quoted);
+
+// A scalar of `type` from its unquoted literal text, as paths and MOF write
+// it: TRUE or FALSE in any case for a boolean, a decimal integer within the
+// type's range, a real number. Otherwise nothing, and `problem` says why,
+// naming the property `name` ("value of <name> is not an integer", ...).
+std::optional<CimValue> bareScalarValue(CMPIType type, const std::string &name, const std::string &text,
+                                        std::string &problem);
 
 // A char16 code unit as UTF-8, and back: false unless `text` is exactly one
 // character of the basic multilingual plane.

@@ -1,6 +1,6 @@
 #include "platform/OmcAssociationInstance.h"
 
-#include <string>
+#include "platform/OmcPropertyNames.h"
 
 namespace OMC {
 
@@ -21,26 +21,6 @@ CmpiObjectPath copyPath(const CmpiObjectPath &from, const CmpiString &ns) {
     }
     return copy;
 }
-
-// The key names of a path, as the null-terminated list CMPI takes.
-class KeyNames {
-public:
-    explicit KeyNames(const CmpiObjectPath &path) {
-        for (unsigned int index = 0, count = path.getKeyCount(); index < count; ++index) {
-            CmpiString name;
-            path.getKey(index, &name);
-            if (!name.isNull()) names.emplace_back(name.charPtr());
-        }
-        for (const std::string &name : names) pointers.push_back(name.c_str());
-        pointers.push_back(nullptr);
-    }
-
-    const char **list() { return pointers.data(); }
-
-private:
-    std::vector<std::string> names;
-    std::vector<const char *> pointers;
-};
 
 }  // namespace
 
@@ -67,7 +47,7 @@ CmpiInstance copyAssociation(const CmpiInstance &association, const CmpiString &
         path.setKey(end.role.charPtr(), end.path);
     }
     CmpiInstance copy(path);
-    if (properties != nullptr) copy.setPropertyFilter(properties, KeyNames(path).list());
+    if (properties != nullptr) copy.setPropertyFilter(properties, PropertyNames(nullptr, path).list());
     for (unsigned int index = 0, count = association.getPropertyCount(); index < count; ++index) {
         CmpiString name;
         const CmpiData value = association.getProperty(index, &name);

@@ -8,6 +8,7 @@
 
 #include "CmpiStatus.h"
 #include "platform/OmcObjectIdentity.h"
+#include "platform/OmcPropertyNames.h"
 
 namespace OMC {
 
@@ -38,30 +39,6 @@ std::string textKeySignature(const CmpiObjectPath &path) {
     return signature;
 }
 
-// The request's property list with the key names of `path` added; null
-// stays null (every property).
-class WantedProperties {
-public:
-    WantedProperties(const char **properties, const CmpiObjectPath &path) : all(properties == nullptr) {
-        if (all) return;
-        for (const char **name = properties; *name != nullptr; ++name) names.emplace_back(*name);
-        for (unsigned int index = 0, count = path.getKeyCount(); index < count; ++index) {
-            CmpiString name;
-            path.getKey(index, &name);
-            if (!name.isNull()) names.emplace_back(name.charPtr());
-        }
-        for (const std::string &name : names) pointers.push_back(name.c_str());
-        pointers.push_back(nullptr);
-    }
-
-    const char **list() { return all ? nullptr : pointers.data(); }
-
-private:
-    bool all;
-    std::vector<std::string> names;
-    std::vector<const char *> pointers;
-};
-
 // Fills `found` for the far ends listed in `members`, all of one class, from
 // one enumeration of that class.
 void fetchClass(const CmpiBroker &broker, const CmpiContext &ctx, const std::vector<CmpiObjectPath> &farEnds,
@@ -70,11 +47,11 @@ void fetchClass(const CmpiBroker &broker, const CmpiContext &ctx, const std::vec
     const CmpiObjectPath &sample = farEnds[members.front()];
     std::unordered_map<std::string, std::vector<std::size_t>> bySignature;
     for (std::size_t member : members) bySignature[textKeySignature(farEnds[member])].push_back(member);
-    WantedProperties wanted(properties, sample);
+    PropertyNames wanted(properties, sample);
     CmpiEnumeration instances;
     try {
         instances = broker.enumInstances(ctx, CmpiObjectPath(sample.getNameSpace(), sample.getClassName().charPtr()),
-                                         wanted.list());
+                                         properties != nullptr ? wanted.list() : nullptr);
     } catch (const CmpiStatus &) {
         return;
     }
