@@ -8,7 +8,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <map>
 #include <set>
 
@@ -28,7 +27,6 @@ using tvxcim::describeFailure;
 const char *const kProviderDir = TVX_SUITE_PROVIDER_DIR;
 const char *const kRegistration = TVX_SUITE_REGISTRATION;
 const std::vector<std::string> kMofFiles = {TVX_SUITE_MOFS};
-const std::vector<std::string> kEnvironment = {TVX_SUITE_ENVIRONMENT};  // NAME=value
 
 enum class Deviation {
     ProviderUnavailable,  // every request for the class fails with CMPI_RC_ERR_FAILED
@@ -81,20 +79,6 @@ std::vector<std::string> servedClasses(bool ProviderRegistration::*kind) {
     }
     return classes;
 }
-
-// Before any provider is loaded, as under ctest so when run by hand.
-class SuiteVariables : public testing::Environment {
-public:
-    void SetUp() override {
-        for (const std::string &variable : kEnvironment) {
-            const std::size_t equals = variable.find('=');
-            ASSERT_EQ(setenv(variable.substr(0, equals).c_str(), variable.substr(equals + 1).c_str(), 1), 0)
-                << variable;
-        }
-    }
-};
-
-testing::Environment *const suiteVariables = testing::AddGlobalTestEnvironment(new SuiteVariables);
 
 TEST(ConsistencySuite, RegistrationServesInstances) {
     ASSERT_NO_THROW(suiteConfig());

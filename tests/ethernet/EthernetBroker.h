@@ -28,7 +28,7 @@ protected:
     }
 };
 
-// Two adapters: nic0 (link up, 1000 Mb/s, MAC 02:1b:21:0a:0b:0c, driver
+// Two adapters: nic0 (link up, 10000 Mb/s, MAC 02:1b:21:0a:0b:0c, driver
 // netdrv 1.2.3, a firmware version wider than its record field) and nic1
 // (link down).
 inline std::string twoAdapterProfile(const std::string &faults = "") {
@@ -37,7 +37,7 @@ inline std::string twoAdapterProfile(const std::string &faults = "") {
          "firmwareVersion": "fw-9.0.0-with-a-text-wider-than-its-field",
          "interfaceName": "vmk-nic0", "capabilities": "0x800", "enabledCapabilities": "0x0",
          "pciBus": 16, "pciSlot": 2, "pciFunction": 1, "pciVendorId": "0x15", "pciDeviceId": "0x10fb",
-         "linkUp": true, "speedMbps": 1000, "fullDuplex": true, "mac": "02:1b:21:0a:0b:0c", "mtu": 9000},
+         "linkUp": true, "speedMbps": 10000, "fullDuplex": true, "mac": "02:1b:21:0a:0b:0c", "mtu": 9000},
         {"name": "nic1", "driverName": "tg3", "driverVersion": "3.1", "firmwareVersion": "bc 5",
          "linkUp": false, "mac": "d0:94:66:1a:2b:3d", "mtu": 1500}
     ], "faults": [)" + faults + "]}";

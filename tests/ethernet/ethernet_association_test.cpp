@@ -12,59 +12,46 @@ const std::string driverNic0 =
 const std::string firmwareNic0 =
     "root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic0\"";
 
-struct Filters {
-    std::string assocClass, resultClass, role, resultRole;
-};
-
 class EthernetAssociations : public EthernetBroker {
 protected:
     void SetUp() override {
         EthernetBroker::SetUp();
         serve(twoAdapterProfile(R"({"call": "PRB_CheckSig"})"));
     }
-    std::vector<std::string> associatorNames(const ObjectPath &source, const Filters &f) {
-        const Response response =
-            broker->associatorNames(source, f.assocClass, f.resultClass, f.role, f.resultRole);
-        EXPECT_EQ(response.rc, CMPI_RC_OK) << response.message.value_or("");
-        return pathTexts(response);
-    }
 };
 
-TEST_F(EthernetAssociations, FromAPortEveryFilterNarrowsTheIdentities) {
-    const struct {
-        const char *what;
-        Filters filters;
-        std::vector<std::string> found;
-    } cases[] = {
-        {"no filter", {}, {driverNic0, firmwareNic0}},
-        {"result class firmware", {"", "Talvex_EPFirmwareSoftwareIdentity", "", ""}, {firmwareNic0}},
-        {"result class base", {"", "CIM_SoftwareIdentity", "", ""}, {driverNic0, firmwareNic0}},
-        {"association class driver", {"Talvex_EPDriverElementSoftwareIdentity", "", "", ""}, {driverNic0}},
-        {"association and result class disagree",
-         {"Talvex_EPDriverElementSoftwareIdentity", "Talvex_EPFirmwareSoftwareIdentity", "", ""}, {}},
-        {"role Dependent, any case", {"", "", "dependent", "ANTECEDENT"}, {driverNic0, firmwareNic0}},
-        {"role Antecedent", {"", "", "Antecedent", ""}, {}},
-        {"result role Dependent", {"", "", "", "Dependent"}, {}},
-    };
-    for (const auto &c : cases) EXPECT_EQ(associatorNames(portPath("nic0"), c.filters), c.found) << c.what;
-}
-
-TEST_F(EthernetAssociations, FromAnIdentityTheOnePort) {
+TEST_F(EthernetAssociations, EveryFilterNarrowsWhatIsFoundFromEitherEnd) {
+    const ObjectPath port = portPath("nic0");
     const ObjectPath firmware =
         identityPath("Talvex_EPFirmwareSoftwareIdentity", "Talvex:Talvex_EPFirmwareSoftwareIdentity:nic3");
-    const std::string port = formatPath(portPath("nic3"));
+    const std::string portNic3 = formatPath(portPath("nic3"));
     const struct {
         const char *what;
-        Filters filters;
+        const ObjectPath &from;
+        std::string assocClass, resultClass, role, resultRole;
         std::vector<std::string> found;
     } cases[] = {
-        {"no filter", {}, {port}},
-        {"result class base of the port", {"", "CIM_NetworkPort", "Antecedent", "Dependent"}, {port}},
-        {"result class elsewhere", {"", "Talvex_EPDriverSoftwareIdentity", "", ""}, {}},
-        {"role Dependent", {"", "", "Dependent", ""}, {}},
-        {"result role Antecedent", {"", "", "", "Antecedent"}, {}},
+        {"no filter", port, "", "", "", "", {driverNic0, firmwareNic0}},
+        {"result class firmware", port, "", "Talvex_EPFirmwareSoftwareIdentity", "", "", {firmwareNic0}},
+        {"result class base", port, "", "CIM_SoftwareIdentity", "", "", {driverNic0, firmwareNic0}},
+        {"association class driver", port, "Talvex_EPDriverElementSoftwareIdentity", "", "", "", {driverNic0}},
+        {"association and result class disagree", port, "Talvex_EPDriverElementSoftwareIdentity",
+         "Talvex_EPFirmwareSoftwareIdentity", "", "", {}},
+        {"role Dependent, any case", port, "", "", "dependent", "ANTECEDENT", {driverNic0, firmwareNic0}},
+        {"role Antecedent", port, "", "", "Antecedent", "", {}},
+        {"result role Dependent", port, "", "", "", "Dependent", {}},
+        {"identity, no filter", firmware, "", "", "", "", {portNic3}},
+        {"identity, result class base of the port", firmware, "", "CIM_NetworkPort", "Antecedent", "Dependent",
+         {portNic3}},
+        {"identity, result class elsewhere", firmware, "", "Talvex_EPDriverSoftwareIdentity", "", "", {}},
+        {"identity, role Dependent", firmware, "", "", "Dependent", "", {}},
+        {"identity, result role Antecedent", firmware, "", "", "", "Antecedent", {}},
     };
-    for (const auto &c : cases) EXPECT_EQ(associatorNames(firmware, c.filters), c.found) << c.what;
+    for (const auto &c : cases) {
+        const Response response = broker->associatorNames(c.from, c.assocClass, c.resultClass, c.role, c.resultRole);
+        EXPECT_EQ(response.rc, CMPI_RC_OK) << c.what << ": " << response.message.value_or("");
+        EXPECT_EQ(pathTexts(response), c.found) << c.what;
+    }
 }
 
 TEST_F(EthernetAssociations, ReferencesCarryBothEndsAndNoStatus) {

@@ -1,10 +1,9 @@
 // The Ethernet port provider as a client sees it through the broker: its
-// factories, its failure statuses, the port, identity and association
-// instances built from the inventory, and lookups by key.
+// failure statuses, the port, identity and association instances built from
+// the inventory, and lookups by key.
 #include <gmock/gmock.h>
 
 #include "EthernetBroker.h"
-#include "model/CimTypes.h"
 
 namespace ethernettest {
 namespace {
@@ -27,22 +26,6 @@ void expectFailures(const std::vector<FailureCase> &cases) {
         EXPECT_TRUE(c.response.instances.empty() && c.response.paths.empty()) << c.what;
         EXPECT_FALSE(c.response.done) << c.what;
     }
-}
-
-TEST_F(EthernetBroker, BothFactoriesShareOneProviderAndOnlyTheInstanceOneAnnouncesIt) {
-    testing::internal::CaptureStderr();
-    auto *association = static_cast<CMPIAssociationMI *>(
-        broker->managementInterface("EthernetPortProvider", InterfaceKind::Association));
-    const std::string afterAssociation = testing::internal::GetCapturedStderr();
-    testing::internal::CaptureStderr();
-    auto *instance = static_cast<CMPIInstanceMI *>(
-        broker->managementInterface("EthernetPortProvider", InterfaceKind::Instance));
-    EXPECT_EQ(testing::internal::GetCapturedStderr(), "--- _Create_InstanceMI() P10CmpiBaseMI\n");
-    EXPECT_EQ(afterAssociation, "");
-    ASSERT_TRUE(association && instance);
-    EXPECT_EQ(instance->hdl, association->hdl);
-    EXPECT_STREQ(instance->ft->miName, "instanceEthernetPortProvider");
-    EXPECT_STREQ(association->ft->miName, "associationEthernetPortProvider");
 }
 
 TEST_F(EthernetBroker, EveryFailureHasItsCodeAndMessage) {
@@ -100,82 +83,56 @@ TEST_F(EthernetBroker, AnEmptyHostAnswersEveryClassWithNothing) {
     }
 }
 
-// Every property as a client of sfcb shows it: the class's defaults and the
-// key of the provider's path first, then the rest in the order set; the
-// path is made of the class's keys. The types after, since MOF text does
-// not tell how wide an integer is.
-TEST_F(EthernetBroker, PortInstanceCarriesEveryPropertyWithItsType) {
+// The values whose text a formatting fault would change: the MAC, the speed
+// in bit/s (beyond 32 bits), the PCI numbers ("0x%u" is decimal, "0x%4x"
+// pads), the capability bit and the link state.
+TEST_F(EthernetBroker, PortValuesAsClientsReadThem) {
     serve(twoAdapterProfile());
     const Response response = broker->enumInstances(classPath("Talvex_EthernetPort"), std::nullopt);
-    ASSERT_TRUE(response.ok()) << response.message.value_or("");
-    ASSERT_EQ(response.instances.size(), 2u);
-    const Instance &nic0 = response.instances[0];
-    EXPECT_EQ(formatInstanceMof(nic0), R"(// root/cimv2:Talvex_EthernetPort.SystemCreationClassName="OMC_UnitaryComputerSystem",SystemName=")" +
-                                           hostName + R"(",CreationClassName="Talvex_EthernetPort",DeviceID="nic0"
-instance of Talvex_EthernetPort
-{
-    EnabledState = 2;
-    RequestedState = 5;
-    EnabledDefault = 2;
-    TransitioningToState = 12;
-    DeviceID = "nic0";
-    SystemCreationClassName = "OMC_UnitaryComputerSystem";
-    SystemName = ")" + hostName + R"(";
-    CreationClassName = "Talvex_EthernetPort";
-    Name = "nic0";
-    ElementName = "nic0";
-    PortType = 0;
-    AutoSense = 0;
-    Caption = "nic0";
-    Speed = 1000000000;
-    LinkTechnology = 2;
-    PermanentAddress = "021B210A0B0C";
-    NetworkAddresses = {"021B210A0B0C"};
-    OperationalStatus = {2};
-    Capabilities = {5};
-    EnabledCapabilities = {0};
-    FullDuplex = TRUE;
-    ActiveMaximumTransmissionUnit = 9000;
-    OtherIdentifyingInfo = {"vmk-nic0", "0x16", "0x2", "0x1", "0x  15", "0x10fb"};
-    IdentifyingDescriptions = {"Interface Name", "PCI Bus", "PCI Slot", "PCI Function", "PCI Vendor", "PCI DeviceID"};
-};
-)");
-    std::string types;
-    for (const NamedValue &property : nic0.properties) {
-        types += cimTypeName(property.value.elementType()) + (property.value.isArray() ? "[] " : " ");
-    }
-    EXPECT_EQ(types, "uint16 uint16 uint16 uint16 string string string string string string uint16 uint16 string "
-                     "uint64 uint16 string string[] uint16[] uint16[] uint16[] boolean uint64 string[] string[] ");
-    const auto nic1 = literals(response.instances[1]);
-    EXPECT_EQ(nic1.at("EnabledState"), "3");
-    EXPECT_EQ(nic1.at("OperationalStatus"), "{10}");
-    EXPECT_EQ(nic1.at("FullDuplex"), "FALSE");
+    ASSERT_EQ(response.instances.size(), 2u) << response.message.value_or("");
+    const std::map<std::string, std::string> nics[] = {literals(response.instances[0]),
+                                                       literals(response.instances[1])};
+    const struct {
+        int nic;
+        const char *property, *literal;
+    } cases[] = {
+        {0, "PermanentAddress", "\"021B210A0B0C\""},
+        {0, "NetworkAddresses", "{\"021B210A0B0C\"}"},
+        {1, "PermanentAddress", "\"D094661A2B3D\""},
+        {0, "Speed", "10000000000"},
+        {0, "OtherIdentifyingInfo", "{\"vmk-nic0\", \"0x16\", \"0x2\", \"0x1\", \"0x  15\", \"0x10fb\"}"},
+        {0, "Capabilities", "{5}"},
+        {0, "EnabledCapabilities", "{0}"},
+        {0, "ActiveMaximumTransmissionUnit", "9000"},
+        {0, "EnabledState", "2"},
+        {0, "OperationalStatus", "{2}"},
+        {0, "FullDuplex", "TRUE"},
+        {1, "EnabledState", "3"},
+        {1, "OperationalStatus", "{10}"},
+        {1, "FullDuplex", "FALSE"},
+    };
+    for (const auto &c : cases) EXPECT_EQ(nics[c.nic].at(c.property), c.literal) << "nic" << c.nic << " " << c.property;
 }
 
 TEST_F(EthernetBroker, IdentitiesAndElementsOfEachAdapter) {
     serve(twoAdapterProfile());
     const struct {
-        const char *cls;
-        std::vector<std::string> literals;  // of nic0, in the order set
+        const char *cls, *elementName, *version;  // of nic0
     } cases[] = {
-        {"Talvex_EPDriverSoftwareIdentity",
-         {"\"Talvex:Talvex_EPDriverSoftwareIdentity:nic0\"", "\"netdrv driver \"", "\"netdrv driver 1.2.3\""}},
-        {"Talvex_EPFirmwareSoftwareIdentity",
-         {"\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic0\"", "\"netdrv device firmware \"",
-          "\"netdrv device firmware fw-9.0.0-with-a-text-wider-than\""}},  // 31 characters kept
+        {"Talvex_EPDriverSoftwareIdentity", "\"netdrv driver \"", "\"netdrv driver 1.2.3\""},
+        {"Talvex_EPFirmwareSoftwareIdentity", "\"netdrv device firmware \"",
+         "\"netdrv device firmware fw-9.0.0-with-a-text-wider-than\""},  // 31 characters kept
     };
     for (const auto &c : cases) {
         const Response response = broker->enumInstances(classPath(c.cls), std::nullopt);
         ASSERT_EQ(response.instances.size(), 2u) << c.cls;
         const auto found = literals(response.instances[0]);
-        EXPECT_EQ(found.at("InstanceID"), c.literals[0]);
-        EXPECT_EQ(found.at("ElementName"), c.literals[1]);
-        EXPECT_EQ(found.at("VersionString"), c.literals[2]);
+        EXPECT_EQ(found.at("ElementName"), c.elementName);
+        EXPECT_EQ(found.at("VersionString"), c.version);
     }
     const Response elements =
         broker->enumInstances(classPath("Talvex_EPFirmwareElementSoftwareIdentity"), std::nullopt);
     ASSERT_EQ(elements.instances.size(), 2u);
-    EXPECT_EQ(elements.instances[1].path.keys.size(), 2u) << "a client's path is made of both references";
     EXPECT_EQ(referenceText(elements.instances[1], "Dependent"), formatPath(portPath("nic1")));
     EXPECT_EQ(referenceText(elements.instances[1], "Antecedent"),
               "root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1\"");
@@ -198,31 +155,27 @@ TEST_F(EthernetBroker, PropertyListFiltersPortsOnly) {
     EXPECT_EQ(literals(drivers.instances[0]).size(), 3u);
 }
 
-// Lookups by the names the provider gives are the consistency suite's.
+// Lookups by the names the provider gives are the consistency suite's; these
+// are the names a client may write otherwise.
 TEST_F(EthernetBroker, LookupsMatchAdapterNamesWithoutRegardToCase) {
     serve(twoAdapterProfile());
-    // A port's path as a client sees it: the class's keys in their order.
-    const auto clientPortText = [&](const char *deviceId) {
-        return "root/cimv2:Talvex_EthernetPort.SystemCreationClassName=\"OMC_UnitaryComputerSystem\",SystemName=\"" +
-               hostName + "\",CreationClassName=\"Talvex_EthernetPort\",DeviceID=\"" + deviceId + "\"";
-    };
     const struct {
         const char *what;
         ObjectPath path;
-        std::vector<std::string> found;
+        const char *key, *found;
     } cases[] = {
-        {"port by upper-case name", portPath("NIC0"), {clientPortText("nic0")}},
+        {"port by upper-case name", portPath("NIC0"), "DeviceID", "nic0"},
         {"class in other case", ObjectPath{"", kNs, "TALVEX_ethernetport", {{"DeviceID", CimValue::makeString("nic1")}}},
-         {clientPortText("nic1")}},
-        {"whatever precedes the last colon", identityPath("Talvex_EPFirmwareSoftwareIdentity", "x:NIC1"),
-         {"root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1\""}},
-        {"InstanceID without colon", identityPath("Talvex_EPDriverSoftwareIdentity", "nic0"),
-         {"root/cimv2:Talvex_EPDriverSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPDriverSoftwareIdentity:nic0\""}},
+         "DeviceID", "nic1"},
+        {"whatever precedes the last colon", identityPath("Talvex_EPFirmwareSoftwareIdentity", "x:NIC1"), "InstanceID",
+         "Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1"},
+        {"InstanceID without colon", identityPath("Talvex_EPDriverSoftwareIdentity", "nic0"), "InstanceID",
+         "Talvex:Talvex_EPDriverSoftwareIdentity:nic0"},
     };
     for (const auto &c : cases) {
         const Response response = broker->getInstance(c.path, std::nullopt);
-        EXPECT_EQ(response.rc, CMPI_RC_OK) << c.what;
-        EXPECT_EQ(pathTexts(response), c.found) << c.what;
+        ASSERT_EQ(response.instances.size(), 1u) << c.what << ": " << response.rc;
+        EXPECT_EQ(response.instances[0].property(c.key)->text, c.found) << c.what;
     }
     // The provider answers OK with nothing; sfcb tells the client so.
     EXPECT_EQ(broker->getInstance(portPath("nic7"), std::nullopt).rc, CMPI_RC_ERR_NOT_FOUND);

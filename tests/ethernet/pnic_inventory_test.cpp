@@ -139,11 +139,5 @@ TEST_F(PnicInventory, ServiceConsoleAsksTheDriverThroughASocket) {
     EXPECT_EQ(askedNames.back(), twentyChars.substr(0, 15));
 }
 
-TEST(DriverDevicePath, FormedFromTheRequestName) {
-    char path[256];
-    formatDriverDevicePath(path, sizeof path, "vmnic0");
-    EXPECT_STREQ(path, "/dev/char/oskdriver/vmnic0");
-}
-
 }  // namespace
 }  // namespace EthernetProvider

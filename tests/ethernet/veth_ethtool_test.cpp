@@ -12,7 +12,6 @@
 #include <cerrno>
 #include <cstdlib>
 #include <cstring>
-#include <iostream>
 #include <string>
 #include <thread>
 #include <vector>
@@ -79,10 +78,8 @@ TEST(ServiceConsoleEthtool, RealVethReportsItsLinkSettings) {
     }
     ASSERT_EQ(outcome.result, 0u);
     ASSERT_EQ(outcome.pnics.size(), 1u);
-    const uint32_t expectedType = portTypeFor(outcome.reported.port, outcome.reported.speed);
-    std::cout << "veth reports port " << int(outcome.reported.port) << ", " << outcome.reported.speed
-              << " Mb/s: port type " << expectedType << "\n";
-    EXPECT_EQ(outcome.pnics[0].portType, expectedType);
+    EXPECT_EQ(outcome.pnics[0].portType, portTypeFor(outcome.reported.port, outcome.reported.speed))
+        << "veth reports port " << int(outcome.reported.port) << ", " << outcome.reported.speed << " Mb/s";
     EXPECT_EQ(outcome.pnics[0].autoSense, (outcome.reported.supported & SUPPORTED_Autoneg) ? 1 : 0);
 }
 

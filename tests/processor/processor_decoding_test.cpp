@@ -85,7 +85,6 @@ TEST(HostSettings, PolicyNamesThreadWordAndModelText) {
         {"static", 0, "", 1, 0, 0, ""},
         {"", 0, "", 1, 0, 0, ""},
         {" dynamic", 0, "", 1, 0, 0, ""},
-        {"custom", 0, "", 1, 0, 0, ""},
     };
     for (const auto &c : cases) {
         HostProcessorSettings host;

@@ -68,36 +68,40 @@ protected:
 
 using Records = std::vector<std::string>;
 
-TEST_F(ProcessorInventory, EachPackageTakesItsFirstCoreAndIsEnabledByItsFirstBusyCore) {
-    const Taken taken = take(twoPackages(R"({"call": "PRB_Get", "node": 799, "instance": 106},
-                                            {"call": "PRB_Get", "node": 800, "instance": 106})"));
-    EXPECT_EQ(taken.result, 0u);
-    // cpu-1 has core 104's own CPUID, not its package's.
-    EXPECT_EQ(taken.records, (Records{"cpu-0 cores 4 vendor 2 brand 10 status 4",
-                                      "cpu-1 cores 4 vendor 3 brand 11 status 1"}));
-}
-
-TEST_F(ProcessorInventory, CoreCountsSetWhereEachPackageStartsInTheCoreList) {
-    // The first package claims no cores, so the second starts at entry 0 too;
-    // had the first asked, the second package's query would fail.
-    const Taken taken = take(host(std::string(R"([
-        {"coreCount": 0, "cores": [{"cpuid": )") + intel + R"(, "state": 1}]},
-        {"coreCount": 1, "cores": [{"cpuid": )" + amd + R"(}]}])",
-                                  R"({"call": "PRB_Get", "node": 799, "nth": 2})"));
-    EXPECT_EQ(taken.result, 0u);
-    EXPECT_EQ(taken.records, (Records{"cpu-0 cores 0 vendor 2 brand 10 status 4",
-                                      "cpu-1 cores 1 vendor 2 brand 10 status 1"}));
-}
-
-TEST_F(ProcessorInventory, NoPackageListAtAllIsNotReadFurtherButAnEmptyOneIs) {
+TEST_F(ProcessorInventory, WalksEachPackageFromWhereItStartsInTheCoreList) {
     const std::string coreListFails = R"({"call": "PRB_GetInstanceListAlloc", "node": 607})";
-    const Taken none = take(host("null", coreListFails));
-    EXPECT_EQ(none.result, 0u);
-    EXPECT_TRUE(none.records.empty());
-    const Taken empty = take(host("[]", coreListFails));
-    EXPECT_EQ(empty.result, 1u);
-    EXPECT_TRUE(empty.records.empty());
-    EXPECT_EQ(take(host("[]")).result, 0u);
+    const struct {
+        const char *what;
+        std::string profile;
+        unsigned int result;
+        Records records;
+    } cases[] = {
+        // cpu-1 has core 104's own CPUID, not its package's.
+        {"first core's CPUID, first busy core's state",
+         twoPackages(R"({"call": "PRB_Get", "node": 799, "instance": 106},
+                        {"call": "PRB_Get", "node": 800, "instance": 106})"),
+         0, {"cpu-0 cores 4 vendor 2 brand 10 status 4", "cpu-1 cores 4 vendor 3 brand 11 status 1"}},
+        // The first package claims no cores, so the second starts at entry 0
+        // too; had the first asked, the second package's query would fail.
+        {"a package of no cores",
+         host(std::string(R"([
+            {"coreCount": 0, "cores": [{"cpuid": )") + intel + R"(, "state": 1}]},
+            {"coreCount": 1, "cores": [{"cpuid": )" + amd + R"(}]}])",
+              R"({"call": "PRB_Get", "node": 799, "nth": 2})"),
+         0, {"cpu-0 cores 0 vendor 2 brand 10 status 4", "cpu-1 cores 1 vendor 2 brand 10 status 1"}},
+        {"a core count beyond the core list fails instead of running on",
+         host(R"([{"coreCount": "0xffffffff", "cores": [{}, {}]}])"), 1,
+         {"cpu-0 cores 4294967295 vendor 1 brand 0 status 4"}},
+        {"no package list at all: the core list is never read", host("null", coreListFails), 0, {}},
+        {"an empty package list: the core list is read", host("[]", coreListFails), 1, {}},
+        {"an empty package list on a sound host", host("[]"), 0, {}},
+    };
+    for (const auto &c : cases) {
+        const Taken taken = take(c.profile);
+        EXPECT_EQ(taken.result, c.result) << c.what;
+        EXPECT_EQ(taken.records, c.records) << c.what;
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << c.what;
+    }
 }
 
 TEST_F(ProcessorInventory, EveryFailingCallGivesOneAndKeepsTheRecordsBeforeIt) {
@@ -127,12 +131,6 @@ TEST_F(ProcessorInventory, EveryFailingCallGivesOneAndKeepsTheRecordsBeforeIt) {
         EXPECT_EQ(taken.records.size(), c.recordsLeft) << c.fault;
         EXPECT_EQ(HostSim_LiveListCount(), 0u) << c.fault;
     }
-}
-
-TEST_F(ProcessorInventory, ACoreCountBeyondTheCoreListFailsInsteadOfRunningOn) {
-    const Taken taken = take(host(R"([{"coreCount": "0xffffffff", "cores": [{}, {}]}])"));
-    EXPECT_EQ(taken.result, 1u);
-    EXPECT_EQ(taken.records.size(), 1u);
 }
 
 }  // namespace
