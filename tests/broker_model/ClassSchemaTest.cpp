@@ -40,6 +40,7 @@ class TST_Derived : tst_base {
     [Key] sint64 Serial;
     uint8 Bytes[4];
     real64 Ref;
+    uint16 Port = 5988;
 };
 
 [Indication] class TST_Event { string Message; };
@@ -71,17 +72,21 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         CMPIType type;
         const char *referenceClass;
         bool key;
+        CimValue defaultValue{};  // null unless the MOF gives one
     };
+    const CimValue caption = CimValue::makeString("default; value");
+    const auto code = [](unsigned value) { return CimValue::makeUnsigned(CMPI_uint16, value); };
     const Expected expected[] = {
         {"TST_Base", "instanceid", CMPI_string, "", true},
-        {"TST_Base", "Caption", CMPI_string, "", false},
-        {"TST_Base", "Codes", CMPI_uint16A, "", false},
+        {"TST_Base", "Caption", CMPI_string, "", false, caption},
+        {"TST_Base", "Codes", CMPI_uint16A, "", false, CimValue::makeArray(CMPI_uint16, {code(1), code(2), code(3)})},
         {"TST_Base", "NotKey", CMPI_boolean, "", false},
         {"TST_Link", "Dependent", CMPI_ref, "TST_Base", true},
         {"TST_Derived", "Serial", CMPI_sint64, "", true},
         {"TST_Derived", "Bytes", CMPI_uint8A, "", false},
         {"TST_Derived", "Ref", CMPI_real64, "", false},
-        {"TST_Derived", "Caption", CMPI_string, "", false},
+        {"TST_Derived", "Port", CMPI_uint16, "", false, code(5988)},
+        {"TST_Derived", "Caption", CMPI_string, "", false, caption},
     };
     for (const Expected &e : expected) {
         const PropertyDecl *p = schema.findProperty(e.cls, e.prop);
@@ -89,14 +94,16 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         EXPECT_EQ(p->type, e.type) << e.prop;
         EXPECT_EQ(p->referenceClass, e.referenceClass) << e.prop;
         EXPECT_EQ(p->key, e.key) << e.prop;
+        EXPECT_EQ(p->defaultValue, e.defaultValue) << e.prop;
     }
     EXPECT_EQ(schema.findProperty("TST_Base", "Serial"), nullptr);
     EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
 }
 
 // Subclasses and associations on real classes show in the broker's dispatch
-// tests; here the spelling, inherited qualifiers and undeclared names.
-TEST_F(ClassSchemaTest, HierarchyQueries) {
+// tests; here the spelling, inherited qualifiers and keys, and undeclared
+// names.
+TEST_F(ClassSchemaTest, HierarchyAndKeysComeBaseFirst) {
     EXPECT_TRUE(schema.isA("tst_derived", "TST_BASE"));
     EXPECT_FALSE(schema.isA("TST_Base", "TST_Derived"));
     EXPECT_FALSE(schema.isA("Nope", "Nope"));
@@ -106,9 +113,6 @@ TEST_F(ClassSchemaTest, HierarchyQueries) {
     EXPECT_TRUE(schema.isIndication("tst_alert"));
     EXPECT_FALSE(schema.isIndication("TST_Link"));
     EXPECT_FALSE(schema.isIndication("Nope"));
-}
-
-TEST_F(ClassSchemaTest, KeysComeBaseFirstWithOverridesOnce) {
     const std::vector<PropertyDecl> keys = schema.keysOf("TST_Derived");
     ASSERT_EQ(keys.size(), 2u);
     EXPECT_EQ(keys[0].name, "InstanceID");
@@ -155,6 +159,8 @@ TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
         {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
         {"\x89PNG\r\n\x1a\n", "t.mof:1: unexpected byte 0x89"},
         {"class A { } ;;", "t.mof:1: expected a class, instance or qualifier declaration, found ';'"},
+        {"class A {\n uint16 p = \"1\"; };", "t.mof:2: default value of p does not fit its type"},
+        {"class A {\n uint16 p = 65536; };", "t.mof:2: default value 65536 of p is out of range for uint16"},
     };
     for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;
 }

@@ -11,6 +11,7 @@ ObjectPath pathOf(const std::string &cls, const std::string &key) {
     return ObjectPath{"", "root/cimv2", cls, {{"Name", CimValue::makeString(key)}}};
 }
 
+// Unsigned integers, booleans and string arrays show in tvxcim's output tests.
 TEST(MofInstanceText, WritesEveryKindOfValue) {
     const Instance inner{pathOf("TST_Inner", "in"), {}};
     Instance instance;
@@ -18,10 +19,8 @@ TEST(MofInstanceText, WritesEveryKindOfValue) {
     instance.properties = {
         {"Name", CimValue::makeString("line1\nline2 \"q\"")},
         {"Missing", CimValue::makeNull(CMPI_string)},
-        {"Count", CimValue::makeUnsigned(CMPI_uint32, 42)},
         {"Delta", CimValue::makeSigned(CMPI_sint8, -3)},
         {"Ratio", CimValue::makeReal(CMPI_real64, 2.5)},
-        {"Flag", CimValue::makeBoolean(false)},
         {"Letter", CimValue::makeUnsigned(CMPI_char16, '\'')},
         {"When", CimValue::makeDateTime({0, false})},
         {"Other", CimValue::makeReference(pathOf("TST_Other", "o\\"))},
@@ -37,10 +36,8 @@ TEST(MofInstanceText, WritesEveryKindOfValue) {
               "{\n"
               "    Name = \"line1\\nline2 \\\"q\\\"\";\n"
               "    Missing = NULL;\n"
-              "    Count = 42;\n"
               "    Delta = -3;\n"
               "    Ratio = 2.5;\n"
-              "    Flag = FALSE;\n"
               "    Letter = '\\'';\n"
               "    When = \"19700101000000.000000+000\";\n"
               "    Other = \"root/cimv2:TST_Other.Name=\\\"o\\\\\\\\\\\"\";\n"

@@ -1,19 +1,7 @@
-# cmake -DNM=nm -DLIBRARY=lib.so -P CheckExports.cmake header...
+# cmake -DNM=nm -DLIBRARY=lib.so "-DHEADERS=a.h|b.h" -P CheckExports.cmake
 # Fails unless the library's defined dynamic symbols are exactly the functions
 # the headers declare.
-
-# The headers are the arguments after the script's own path.
-set(headers)
-set(first_header ${CMAKE_ARGC})
-math(EXPR last "${CMAKE_ARGC} - 1")
-foreach(i RANGE ${last})
-  if(CMAKE_ARGV${i} STREQUAL "-P")
-    math(EXPR first_header "${i} + 2")
-  elseif(i GREATER_EQUAL first_header)
-    list(APPEND headers "${CMAKE_ARGV${i}}")
-  endif()
-endforeach()
-
+string(REPLACE "|" ";" headers "${HEADERS}")
 set(declared)
 foreach(header IN LISTS headers)
   file(STRINGS "${header}" lines)
@@ -25,17 +13,12 @@ foreach(header IN LISTS headers)
   endforeach()
 endforeach()
 
-execute_process(COMMAND "${NM}" -D --defined-only "${LIBRARY}"
-  OUTPUT_VARIABLE table RESULT_VARIABLE failed)
+execute_process(COMMAND "${NM}" -D --defined-only --format=just-symbols "${LIBRARY}"
+  OUTPUT_VARIABLE exported RESULT_VARIABLE failed)
 if(failed)
   message(FATAL_ERROR "${NM} cannot read ${LIBRARY}")
 endif()
-string(REGEX MATCHALL "[^\n]+" rows "${table}")
-set(exported)
-foreach(row IN LISTS rows)
-  string(REGEX REPLACE "^[0-9a-fA-F]* *[A-Za-z] +" "" name "${row}")
-  list(APPEND exported "${name}")
-endforeach()
+string(REGEX MATCHALL "[^\n]+" exported "${exported}")
 
 list(SORT declared)
 list(SORT exported)

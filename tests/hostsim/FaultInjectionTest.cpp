@@ -42,7 +42,9 @@ protected:
 };
 
 // Which list-handling calls fail is left to the inventories' tests, whose
-// faults name texts, values and indexes and count the records kept.
+// faults name texts, values and indexes and count the records kept. The
+// nth-call cases come after others of the same call, so they fail unless
+// loading a profile restarts the count.
 TEST_F(HostSimFaults, EachRuleFailsExactlyTheCallsItNames) {
     const std::tuple<nlohmann::json, std::vector<PlatformCall>, std::vector<int>> cases[] = {
         {{{"call", "PRB_Get"}, {"node", 72}, {"instance", "vmnic1"}},
@@ -65,15 +67,6 @@ TEST_F(HostSimFaults, EachRuleFailsExactlyTheCallsItNames) {
         for (const PlatformCall &call : calls) got.push_back(call());
         EXPECT_EQ(got, statuses) << rule;
     }
-}
-
-TEST_F(HostSimFaults, LoadingAProfileRestartsTheCallCount) {
-    const nlohmann::json rule = {{"call", "PRB_CheckSig"}, {"nth", 2}};
-    serveWith(rule);
-    EXPECT_EQ(checkSig(), ok);
-    serveWith(rule);
-    EXPECT_EQ(checkSig(), ok);
-    EXPECT_EQ(checkSig(), failed);
 }
 
 }  // namespace

@@ -4,13 +4,9 @@
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
-#include <cstddef>
 #include <cstdint>
-#include <cstring>
 #include <memory>
 #include <string>
-#include <utility>
 #include <variant>
 #include <vector>
 
@@ -32,11 +28,10 @@ using Param = std::variant<std::string, std::int64_t>;
 inline List listOf(const std::vector<Param> &params) {
     List list(PRB_ParamListCreate(1, 1));
     for (const Param &param : params) {
-        if (const auto *text = std::get_if<std::string>(&param)) {
-            EXPECT_EQ(PRB_ParamListAddString(list.get(), text->c_str()), 0);
-        } else {
-            EXPECT_EQ(PRB_ParamListAddInt(list.get(), std::get<std::int64_t>(param)), 0);
-        }
+        const auto *text = std::get_if<std::string>(&param);
+        EXPECT_EQ(text ? PRB_ParamListAddString(list.get(), text->c_str())
+                       : PRB_ParamListAddInt(list.get(), std::get<std::int64_t>(param)),
+                  0);
     }
     return list;
 }
@@ -63,28 +58,6 @@ inline std::vector<std::string> servedAdapterNames() {
 inline int readNode(int node, const std::vector<Param> &params, Bytes &buffer) {
     const List list = listOf(params);
     return PRB_Get(node, list.get(), buffer.data(), int(buffer.size()));
-}
-
-// A record field holding `text`: zero-padded, or cut to `width`.
-inline Bytes textField(const std::string &text, std::size_t width) {
-    Bytes bytes(width, 0);
-    std::memcpy(bytes.data(), text.data(), std::min(width, text.size()));
-    return bytes;
-}
-
-// Offset and bytes of each field of a record.
-using Fields = std::vector<std::pair<std::size_t, Bytes>>;
-
-// Each field holds its bytes, and every byte of no field is zero.
-inline void expectFieldsElseZero(const Bytes &record, const Fields &fields) {
-    std::vector<bool> inField(record.size(), false);
-    for (const auto &[offset, bytes] : fields) {
-        EXPECT_EQ(Bytes(record.begin() + offset, record.begin() + offset + bytes.size()), bytes) << offset;
-        std::fill_n(inField.begin() + offset, bytes.size(), true);
-    }
-    for (std::size_t i = 0; i < record.size(); ++i) {
-        EXPECT_TRUE(inField[i] || record[i] == 0) << "byte " << i << " belongs to no field";
-    }
 }
 
 // A "Corlai" host. Vectors, since a braced single json would not become an array.

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <stdexcept>
+#include <tuple>
 
 #include "TvxcimRun.h"
 
@@ -15,76 +16,60 @@ using namespace tvxcimtest;
 
 constexpr const char *kMissingFile = "/nonexistent/tvxcim-test-file";
 
-struct ErrorCase {
-    const char *name;
-    Args args;
-    int status;
-    std::string message;
-};
-
-void PrintTo(const ErrorCase &test, std::ostream *os) { *os << test.name; }
-
-class TvxcimErrorTest : public testing::TestWithParam<ErrorCase> {};
-
-TEST_P(TvxcimErrorTest, EndsInOneLineAndItsStatus) {
-    const Outcome run = runWith(GetParam().args);
-    EXPECT_EQ(run.status, GetParam().status);
-    EXPECT_EQ(run.out, "");
-    EXPECT_EQ(run.err, "tvxcim: " + GetParam().message + "\n");
-}
-
 const std::string kUsageHint = " (tvxcim --help shows the usage)";
 
-INSTANTIATE_TEST_SUITE_P(
-    BadInput, TvxcimErrorTest,
-    testing::Values(
-        ErrorCase{"ValueNotQuoted", onTestProviders({"gi", "root/cimv2:Test_Widget.Name=zz"}), 1,
-                  "malformed object path 'root/cimv2:Test_Widget.Name=zz': "
-                  "value of Name must be quoted at position 28"},
-        ErrorCase{"UnknownClassInPath", onTestProviders({"gi", R"(root/cimv2:Test_Widgt.Name="a")"}), 1,
-                  R"(unknown class Test_Widgt in object path 'root/cimv2:Test_Widgt.Name="a"': no MOF file declares it)"},
-        ErrorCase{"UnknownClass", onTestProviders({"ei", "root/cimv2:Nope"}), 1,
-                  "unknown class Nope: no MOF file declares it"},
-        ErrorCase{"UnknownAssocClass", onTestProviders({"--assoc-class", "Nope", "ai", kAlpha}), 1,
-                  "unknown class Nope given to --assoc-class: no MOF file declares it"},
-        ErrorCase{"UnknownResultClass", onTestProviders({"--result-class", "Nope", "rin", kAlpha}), 1,
-                  "unknown class Nope given to --result-class: no MOF file declares it"},
-        ErrorCase{"EmptyClassName", onTestProviders({"ein", "root/cimv2:"}), 1,
-                  "malformed class name 'root/cimv2:': use CLASS or namespace:CLASS"},
-        ErrorCase{"MissingLibrary", onTestProviders({"ei", "Test_Missing"}), 1,
-                  "CMPI_RC_ERR_FAILED (1): provider MissingLib: provider library "
-                  "libtvxnosuchlibrary.so not found in the provider directories"},
-        ErrorCase{"StatusWithMessageEvenInJson",
-                  onTestProviders({"--json", "gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
-                  "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
-        ErrorCase{"StatusWithoutMessage",
-                  onTestProviders({"gi", "root/cimv2:Test_ProviderStats.ProviderName=\"WidgetProvider\""}), 1,
-                  "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
-        ErrorCase{"MissingRegistration",
-                  withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
-                  std::string("cannot read ") + kMissingFile},
-        ErrorCase{"GarbledRegistration",
-                  withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_MOF, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
-                  std::string(TVX_TESTPROVIDER_MOF) + ":1: expected 'key: value'"},
-        ErrorCase{"MissingMof",
-                  withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_REG, kMissingFile, {"ei", "Test_Widget"}), 1,
-                  std::string("cannot read ") + kMissingFile},
-        ErrorCase{"MissingProviderDirectory",
-                  withFiles(kMissingFile, TVX_TESTPROVIDER_REG, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
-                  std::string("provider directory ") + kMissingFile + " does not exist"},
-        ErrorCase{"NoCommand", onTestProviders({}), 2, "no command given" + kUsageHint},
-        ErrorCase{"UnknownCommand", onTestProviders({"list"}), 2, "unknown command list" + kUsageHint},
-        ErrorCase{"UnknownOption", onTestProviders({"--jsn", "ei", "Test_Widget"}), 2,
-                  "unknown option --jsn" + kUsageHint},
-        ErrorCase{"MissingArgument", onTestProviders({"gi"}), 2, "gi needs an argument" + kUsageHint},
-        ErrorCase{"ListenForAClass", onTestProviders({"listen", "Test_Event"}), 2,
-                  "unexpected argument Test_Event" + kUsageHint},
-        ErrorCase{"ListenWithoutIndicationClasses",
-                  withFiles(TVX_TESTPROVIDER_DIR, TVX_OMCTESTPROVIDER_REG, TVX_OMCTESTPROVIDER_MOF, {"listen"}), 1,
-                  "the registration serves no indication class"},
-        ErrorCase{"NoRegistration", Args{"--provider-dir", "/tmp", "ei", "Test_Widget"}, 2,
-                  "no provider registration: use --registration" + kUsageHint}),
-    [](const auto &test) { return std::string(test.param.name); });
+TEST(TvxcimErrorTest, BadInputEndsInOneLineAndItsStatus) {
+    const std::tuple<const char *, Args, int, std::string> cases[] = {
+        {"ValueNotQuoted", onTestProviders({"gi", "root/cimv2:Test_Widget.Name=zz"}), 1,
+         "malformed object path 'root/cimv2:Test_Widget.Name=zz': "
+         "value of Name must be quoted at position 28"},
+        {"UnknownClassInPath", onTestProviders({"gi", R"(root/cimv2:Test_Widgt.Name="a")"}), 1,
+         R"(unknown class Test_Widgt in object path 'root/cimv2:Test_Widgt.Name="a"': no MOF file declares it)"},
+        {"UnknownClass", onTestProviders({"ei", "root/cimv2:Nope"}), 1, "unknown class Nope: no MOF file declares it"},
+        {"UnknownAssocClass", onTestProviders({"--assoc-class", "Nope", "ai", kAlpha}), 1,
+         "unknown class Nope given to --assoc-class: no MOF file declares it"},
+        {"UnknownResultClass", onTestProviders({"--result-class", "Nope", "rin", kAlpha}), 1,
+         "unknown class Nope given to --result-class: no MOF file declares it"},
+        {"EmptyClassName", onTestProviders({"ein", "root/cimv2:"}), 1,
+         "malformed class name 'root/cimv2:': use CLASS or namespace:CLASS"},
+        {"MissingLibrary", onTestProviders({"ei", "Test_Missing"}), 1,
+         "CMPI_RC_ERR_FAILED (1): provider MissingLib: provider library "
+         "libtvxnosuchlibrary.so not found in the provider directories"},
+        {"StatusWithMessageEvenInJson", onTestProviders({"--json", "gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
+         "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
+        {"StatusWithoutMessage",
+         onTestProviders({"gi", "root/cimv2:Test_ProviderStats.ProviderName=\"WidgetProvider\""}), 1,
+         "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
+        {"MissingRegistration",
+         withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+         std::string("cannot read ") + kMissingFile},
+        {"GarbledRegistration",
+         withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_MOF, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+         std::string(TVX_TESTPROVIDER_MOF) + ":1: expected 'key: value'"},
+        {"MissingMof", withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_REG, kMissingFile, {"ei", "Test_Widget"}), 1,
+         std::string("cannot read ") + kMissingFile},
+        {"MissingProviderDirectory",
+         withFiles(kMissingFile, TVX_TESTPROVIDER_REG, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
+         std::string("provider directory ") + kMissingFile + " does not exist"},
+        {"NoCommand", onTestProviders({}), 2, "no command given" + kUsageHint},
+        {"UnknownCommand", onTestProviders({"list"}), 2, "unknown command list" + kUsageHint},
+        {"UnknownOption", onTestProviders({"--jsn", "ei", "Test_Widget"}), 2, "unknown option --jsn" + kUsageHint},
+        {"MissingArgument", onTestProviders({"gi"}), 2, "gi needs an argument" + kUsageHint},
+        {"ListenForAClass", onTestProviders({"listen", "Test_Event"}), 2,
+         "unexpected argument Test_Event" + kUsageHint},
+        {"ListenWithoutIndicationClasses",
+         withFiles(TVX_TESTPROVIDER_DIR, TVX_OMCTESTPROVIDER_REG, TVX_OMCTESTPROVIDER_MOF, {"listen"}), 1,
+         "the registration serves no indication class"},
+        {"NoRegistration", Args{"--provider-dir", "/tmp", "ei", "Test_Widget"}, 2,
+         "no provider registration: use --registration" + kUsageHint},
+    };
+    for (const auto &[what, args, status, message] : cases) {
+        const Outcome run = runWith(args);
+        EXPECT_EQ(run.status, status) << what;
+        EXPECT_EQ(run.out, "") << what;
+        EXPECT_EQ(run.err, "tvxcim: " + message + "\n") << what;
+    }
+}
 
 TEST(TvxcimPreflightTest, RunsBeforeAnythingIsLoadedAndSeesTheCommandLine) {
     std::string seenCommand;
