@@ -2,7 +2,8 @@
 // statuses included, comes back unchanged, leaving no broker object behind:
 // instance operations, property lists, subclasses, both result filters,
 // up-calls and association walks. How values of each kind read shows in
-// tvxcim's output tests.
+// tvxcim's output tests, and that names and instances agree for every class
+// in the consistency suite.
 #include <functional>
 
 #include "BrokerFixture.h"
@@ -11,13 +12,23 @@ namespace brokertest {
 namespace {
 
 using testing::_;
+using testing::AllOf;
+using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Matcher;
 using testing::Not;
 using testing::Optional;
 
+// Asked twice, each request fails the same way: a provider that could not be
+// loaded stays failed, and leaves the others working.
 TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
     const Instance alpha{widget("alpha"), {{"Size", CimValue::makeUnsigned(CMPI_uint32, 5)}}};
+    const auto failedNaming = [](const char *cause) {
+        return Optional(AllOf(HasSubstr(cause), Not(HasSubstr("\n"))));
+    };
+    const auto names = [this](const char *cls) {
+        return [this, cls] { return broker.enumInstanceNames(classPath(cls)); };
+    };
     struct Case {
         const char *request;
         std::function<Response()> call;
@@ -25,6 +36,14 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
         Matcher<std::optional<std::string>> message;
     };
     const Case cases[] = {
+        {"a provider library that does not exist", names("Test_Missing"), CMPI_RC_ERR_FAILED,
+         failedNaming("tvxnosuchlibrary")},
+        {"a factory missing from the library", names("Test_NoFactory"), CMPI_RC_ERR_FAILED,
+         failedNaming("NoSuchProvider_Create_InstanceMI")},
+        {"a factory returning no interface", names("Test_NullFactory"), CMPI_RC_ERR_FAILED,
+         failedNaming("NullProvider")},
+        {"a provider constructor throwing", names("Test_ThrowingFactory"), CMPI_RC_ERR_FAILED,
+         failedNaming("ThrowingProvider")},
         {"createInstance throwing a status", [&] { return broker.createInstance(widget("alpha"), alpha); },
          CMPI_RC_ERR_ALREADY_EXISTS, Optional(std::string("widget exists"))},
         {"setInstance throwing std::runtime_error",
@@ -56,6 +75,9 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
         const Response response = c.call();
         EXPECT_EQ(response.rc, c.rc);
         EXPECT_THAT(response.message, c.message);
+        const Response again = c.call();
+        EXPECT_EQ(again.rc, response.rc);
+        EXPECT_EQ(again.message, response.message);
     }
 }
 
@@ -84,7 +106,6 @@ TEST_F(BrokerTest, PropertyListsKeepOnlyTheListedProperties) {
     };
     const Case cases[] = {
         {std::nullopt, optional},
-        {std::vector<std::string>{"Size"}, {"Size"}},
         {std::vector<std::string>{"caption", "ENABLED"}, {"Caption", "Enabled"}},
         {std::vector<std::string>{}, {}},
     };
@@ -117,10 +138,7 @@ TEST_F(BrokerTest, EnumerationReachesSubclassesAndWhatUpCallsFind) {
     const Case cases[] = {
         {"Test_ManagedElement", everyWidget},
         {"Test_Widget", everyWidget},
-        {"Test_SpecialWidget", texts({gamma})},
         {"Test_Gadget", texts({gadget("alpha"), gadget("beta"), gadget("gamma")})},
-        {"Test_WidgetGadget", texts({link(widget("alpha"), gadget("alpha")), link(widget("beta"), gadget("beta")),
-                                     link(gamma, gadget("gamma"))})},
     };
     for (const Case &c : cases) {
         SCOPED_TRACE(c.cls);

@@ -1,8 +1,9 @@
 // How the broker obtains providers through the binding's factories: objects
 // shared or kept apart by their base objects, the instance factory's line on
-// standard error, providers that cannot be loaded, and dispatch functions
-// that refuse a handle of the wrong kind instead of crashing. A provider that
-// never unloads refusing a cleanup shows in the heartbeat's tests.
+// standard error, and dispatch functions that refuse a handle of the wrong
+// kind instead of crashing. Providers that cannot be loaded show with the
+// other failures in dispatch_test.cpp; a provider that never unloads refusing
+// a cleanup shows in the heartbeat's tests.
 #include <dlfcn.h>
 
 #include <functional>
@@ -13,11 +14,6 @@
 
 namespace brokertest {
 namespace {
-
-using testing::AllOf;
-using testing::HasSubstr;
-using testing::Not;
-using testing::Optional;
 
 constexpr const char *kProviderLibrary = TVX_TESTPROVIDER_DIR "/libtvxtestprovider.so";
 const std::string kFactoryLine = "--- _Create_InstanceMI() P10CmpiBaseMI\n";
@@ -104,30 +100,6 @@ TEST_F(BrokerTest, FactoriesShareProviderObjectsExactlyAsTheirBaseObjectsDo) {
     const ProviderStats links = statsOf(broker, "WidgetGadgetProvider");
     EXPECT_EQ(links.initialized, 1u);
     EXPECT_EQ(links.useCount, 2);
-}
-
-TEST_F(BrokerTest, ProvidersThatCannotLoadAnswerFailedNamingTheCause) {
-    struct Case {
-        const char *cls;
-        const char *named;
-    };
-    const Case cases[] = {
-        {"Test_Missing", "tvxnosuchlibrary"},
-        {"Test_NoFactory", "NoSuchProvider_Create_InstanceMI"},
-        {"Test_NullFactory", "NullProvider"},
-        {"Test_ThrowingFactory", "ThrowingProvider"},
-    };
-    for (const Case &c : cases) {
-        SCOPED_TRACE(c.cls);
-        const Response first = broker.enumInstanceNames(classPath(c.cls));
-        const Response again = broker.enumInstanceNames(classPath(c.cls));
-        EXPECT_EQ(first.rc, CMPI_RC_ERR_FAILED);
-        EXPECT_THAT(first.message, Optional(AllOf(HasSubstr(c.named), Not(HasSubstr("\n")))));
-        EXPECT_EQ(again.rc, first.rc);
-        EXPECT_EQ(again.message, first.message);
-    }
-
-    EXPECT_EQ(broker.enumInstanceNames(classPath("Test_Widget")).paths.size(), 3u);
 }
 
 // The widget provider has an instance side only, so the association and

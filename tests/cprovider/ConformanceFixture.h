@@ -32,15 +32,14 @@ struct Served {
 inline constexpr Served kCProvider{"Conf_CSample", "Conf_CPeer"};
 inline constexpr Served kTwin{"Conf_BindingSample", "Conf_BindingPeer"};
 
-ObjectPath samplePath(const std::string &cls, const conf_sample &sample);
 std::vector<Instance> expectedSamples(const std::string &cls);
 Instance expectedPeer(const Served &provider);
 
 // Key by key and property by property, each failure naming what differs and
 // showing both values; the order of keys, properties and list items does
-// not matter, as in CIM.
-void expectSamePaths(std::vector<ObjectPath> actual, std::vector<ObjectPath> expected);
+// not matter, as in CIM. Paths are held against the paths of `expected`.
 void expectSameInstances(std::vector<Instance> actual, std::vector<Instance> expected);
+void expectSamePaths(const std::vector<ObjectPath> &actual, std::vector<Instance> expected);
 
 class ConformanceTest : public testing::Test {
 protected:

@@ -88,8 +88,7 @@ public:
         } else if (cop.classPathIsA(kPeerClass)) {
             rslt.returnData(peerInstance(ns));
         }
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
@@ -106,8 +105,7 @@ public:
         }
         if (found.isNull()) return CmpiStatus(CMPI_RC_ERR_NOT_FOUND, "no such object");
         rslt.returnData(found);
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 };
 

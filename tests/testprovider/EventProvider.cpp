@@ -57,8 +57,7 @@ public:
         counter.setProperty("Name", "events");
         counter.setProperty("Delivered", delivered.load());
         rslt.returnData(counter);
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     // A subscription activates its filter before enabling indications.

@@ -23,8 +23,7 @@ public:
             const CmpiObjectPath widget = widgets.getNext();
             rslt.returnData(gadgetPath(ns, stringKey(widget, "Name")));
         }
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     CmpiStatus enumInstances(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
@@ -45,8 +44,7 @@ public:
         gadget.setProperty("Id", id);
         gadget.setProperty("WidgetName", widgetName);
         rslt.returnData(gadget);
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 };
 

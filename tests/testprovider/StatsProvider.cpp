@@ -48,8 +48,7 @@ public:
             stats.setProperty("UseCount", uses);
             rslt.returnData(stats);
         }
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 };
 

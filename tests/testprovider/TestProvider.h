@@ -1,5 +1,6 @@
 // What the test providers share: the names they serve, the rule that ties a
-// gadget to its widget, key reading, and the base of every instance provider.
+// gadget to its widget, key reading, ending an answer, and the base of every
+// instance provider.
 #pragma once
 
 #include <atomic>
@@ -24,6 +25,12 @@ inline std::string stringKey(const CmpiObjectPath &path, const char *key) {
         throw CmpiStatus(CMPI_RC_ERR_INVALID_PARAMETER, (std::string(key) + " key missing").c_str());
     }
     return text;
+}
+
+// Ends a successful answer.
+inline CmpiStatus done(CmpiResult &rslt) {
+    rslt.returnDone();
+    return CmpiStatus(CMPI_RC_OK);
 }
 
 inline CmpiObjectPath widgetPath(const CmpiString &ns, const std::string &name) {

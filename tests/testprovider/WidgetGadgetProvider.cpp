@@ -73,8 +73,7 @@ public:
             const Link link{ns, widget, gadgetPath(ns, stringKey(widget, "Name")), true};
             rslt.returnData(link.instance(properties));
         }
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     CmpiStatus references(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
@@ -109,11 +108,6 @@ public:
     }
 
 private:
-    static CmpiStatus done(CmpiResult &rslt) {
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
-    }
-
     // The link `op` is an end of; none for a path of any other class. An
     // unknown widget fails with the widget provider's status.
     std::optional<Link> linkOf(const CmpiContext &ctx, const CmpiObjectPath &op) const {

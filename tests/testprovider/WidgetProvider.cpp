@@ -62,8 +62,7 @@ public:
                 rslt.returnData(makeWidget(ns, widget, properties));
             }
         }
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
@@ -77,8 +76,7 @@ public:
             return CmpiStatus(CMPI_RC_ERR_NOT_FOUND, ("no widget " + name).c_str());
         }
         rslt.returnData(makeWidget(cop.getNameSpace(), *found, properties));
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
+        return done(rslt);
     }
 
     CmpiStatus createInstance(const CmpiContext &, CmpiResult &, const CmpiObjectPath &,

@@ -39,26 +39,20 @@ static const char *key_text(const CMPIObjectPath *op, const char *name) {
     return CP_CHARS(d.value.string);
 }
 
-/* An integer key of whichever width the client's path carries. */
-static int key_number(const CMPIObjectPath *op, const char *name, CMPIUint64 *out) {
+/* A uint16 key, the type its class declares. */
+static int key_uint16(const CMPIObjectPath *op, const char *name, CMPIUint16 *out) {
     CMPIData d = CP_GET_KEY(op, name);
-    if (!is_value(d)) return 0;
-    switch (d.type) {
-    case CMPI_uint8: *out = d.value.uint8; return 1;
-    case CMPI_uint16: *out = d.value.uint16; return 1;
-    case CMPI_uint32: *out = d.value.uint32; return 1;
-    case CMPI_uint64: *out = d.value.uint64; return 1;
-    case CMPI_sint64: *out = (CMPIUint64)d.value.sint64; return d.value.sint64 >= 0;
-    default: return 0;
-    }
+    if (d.type != CMPI_uint16 || !is_value(d)) return 0;
+    *out = d.value.uint16;
+    return 1;
 }
 
 static const struct conf_sample *find_sample(const CMPIObjectPath *op) {
     const char *name = key_text(op, "Name");
     const char *label = key_text(op, "Label");
-    CMPIUint64 slot = 0;
+    CMPIUint16 slot = 0;
     int i;
-    if (name == NULL || label == NULL || !key_number(op, "Slot", &slot)) return NULL;
+    if (name == NULL || label == NULL || !key_uint16(op, "Slot", &slot)) return NULL;
     for (i = 0; i < CONF_SAMPLE_COUNT; ++i) {
         const struct conf_sample *s = &conf_samples[i];
         if (strcmp(name, s->name) == 0 && strcmp(label, s->label) == 0 && slot == s->slot) return s;
@@ -76,23 +70,17 @@ static const struct conf_sample *referenced_sample(const CMPIObjectPath *op, con
 static CMPIStatus return_all(const CMPIResult *rslt, const CMPIObjectPath *op, int instances) {
     CMPIStatus st = {CMPI_RC_OK, NULL};
     const char *ns = namespace_of(op);
+    const int samples = serves(op, CP_SAMPLE_CLASS);
+    const int count = samples ? CONF_SAMPLE_COUNT : serves(op, CP_PEER_CLASS); /* one peer or none */
     int i;
-    if (serves(op, CP_SAMPLE_CLASS)) {
-        for (i = 0; i < CONF_SAMPLE_COUNT && st.rc == CMPI_RC_OK; ++i) {
-            if (instances) {
-                CMPIInstance *ci = sample_instance(broker, ns, &conf_samples[i], &st);
-                if (ci != NULL) st = CP_RETURN_INSTANCE(rslt, ci);
-            } else {
-                CMPIObjectPath *path = sample_path(broker, ns, &conf_samples[i], &st);
-                if (path != NULL) st = CP_RETURN_PATH(rslt, path);
-            }
-        }
-    } else if (serves(op, CP_PEER_CLASS)) {
+    for (i = 0; i < count && st.rc == CMPI_RC_OK; ++i) {
         if (instances) {
-            CMPIInstance *ci = peer_instance(broker, ns, &st);
+            CMPIInstance *ci = samples ? sample_instance(broker, ns, &conf_samples[i], &st)
+                                       : peer_instance(broker, ns, &st);
             if (ci != NULL) st = CP_RETURN_INSTANCE(rslt, ci);
         } else {
-            CMPIObjectPath *path = peer_path(broker, ns, &st);
+            CMPIObjectPath *path = samples ? sample_path(broker, ns, &conf_samples[i], &st)
+                                           : peer_path(broker, ns, &st);
             if (path != NULL) st = CP_RETURN_PATH(rslt, path);
         }
     }
@@ -102,17 +90,14 @@ static CMPIStatus return_all(const CMPIResult *rslt, const CMPIObjectPath *op, i
 
 static CMPIStatus enum_instance_names(CMPIInstanceMI *mi, const CMPIContext *ctx,
                                       const CMPIResult *rslt, const CMPIObjectPath *op) {
-    (void)mi;
-    (void)ctx;
+    (void)mi, (void)ctx;
     return return_all(rslt, op, 0);
 }
 
 static CMPIStatus enum_instances(CMPIInstanceMI *mi, const CMPIContext *ctx,
                                  const CMPIResult *rslt, const CMPIObjectPath *op,
                                  const char **properties) {
-    (void)mi;
-    (void)ctx;
-    (void)properties;
+    (void)mi, (void)ctx, (void)properties;
     return return_all(rslt, op, 1);
 }
 
@@ -121,9 +106,7 @@ static CMPIStatus get_instance(CMPIInstanceMI *mi, const CMPIContext *ctx, const
     CMPIStatus st = {CMPI_RC_OK, NULL};
     const char *ns = namespace_of(op);
     CMPIInstance *ci = NULL;
-    (void)mi;
-    (void)ctx;
-    (void)properties;
+    (void)mi, (void)ctx, (void)properties;
     if (serves(op, CP_SAMPLE_CLASS)) {
         const struct conf_sample *s = find_sample(op);
         if (s != NULL) ci = sample_instance(broker, ns, s, &st);
@@ -138,14 +121,11 @@ static CMPIStatus get_instance(CMPIInstanceMI *mi, const CMPIContext *ctx, const
     return st;
 }
 
+/* The operations a read-only C provider still has to fill its table with. */
 static CMPIStatus create_instance(CMPIInstanceMI *mi, const CMPIContext *ctx,
                                   const CMPIResult *rslt, const CMPIObjectPath *op,
                                   const CMPIInstance *inst) {
-    (void)mi;
-    (void)ctx;
-    (void)rslt;
-    (void)op;
-    (void)inst;
+    (void)mi, (void)ctx, (void)rslt, (void)op, (void)inst;
     return status_of(CMPI_RC_ERR_NOT_SUPPORTED, NULL);
 }
 
@@ -163,15 +143,12 @@ static CMPIStatus delete_instance(CMPIInstanceMI *mi, const CMPIContext *ctx,
 
 static CMPIStatus exec_query(CMPIInstanceMI *mi, const CMPIContext *ctx, const CMPIResult *rslt,
                              const CMPIObjectPath *op, const char *query, const char *lang) {
-    (void)query;
-    (void)lang;
+    (void)query, (void)lang;
     return create_instance(mi, ctx, rslt, op, NULL);
 }
 
 static CMPIStatus cleanup(CMPIInstanceMI *mi, const CMPIContext *ctx, CMPIBoolean terminating) {
-    (void)mi;
-    (void)ctx;
-    (void)terminating;
+    (void)mi, (void)ctx, (void)terminating;
     return status_of(CMPI_RC_OK, NULL);
 }
 

@@ -9,55 +9,24 @@ static void keep(CMPIStatus *st, CMPIStatus next) {
     if (st->rc == CMPI_RC_OK) *st = next;
 }
 
-/* True for an object the broker made; otherwise keeps why it did not. */
-static int made(const void *object, CMPIStatus rc, CMPIStatus *st) {
-    if (object != NULL) return 1;
-    if (rc.rc == CMPI_RC_OK) rc.rc = CMPI_RC_ERR_FAILED;
-    keep(st, rc);
-    return 0;
-}
-
-static CMPIObjectPath *new_path(const CMPIBroker *mb, const char *ns, const char *cls,
-                                CMPIStatus *st) {
-    CMPIStatus rc = {CMPI_RC_OK, NULL};
-    CMPIObjectPath *op = mb->eft->newObjectPath(mb, ns, cls, &rc);
-    return made(op, rc, st) ? op : NULL;
-}
-
-static CMPIInstance *new_instance(const CMPIBroker *mb, const CMPIObjectPath *op, CMPIStatus *st) {
-    CMPIStatus rc = {CMPI_RC_OK, NULL};
-    CMPIInstance *ci = mb->eft->newInstance(mb, op, &rc);
-    return made(ci, rc, st) ? ci : NULL;
-}
-
-static CMPIString *new_text(const CMPIBroker *mb, const char *text, CMPIStatus *st) {
-    CMPIStatus rc = {CMPI_RC_OK, NULL};
-    CMPIString *s = mb->eft->newString(mb, text, &rc);
-    made(s, rc, st);
-    return s;
-}
-
-static CMPIArray *new_array(const CMPIBroker *mb, CMPICount size, CMPIType type, CMPIStatus *st) {
-    CMPIStatus rc = {CMPI_RC_OK, NULL};
-    CMPIArray *array = mb->eft->newArray(mb, size, type, &rc);
-    made(array, rc, st);
-    return array;
-}
-
-static CMPIDateTime *new_datetime(const CMPIBroker *mb, CMPIUint64 microseconds,
-                                  CMPIBoolean interval, CMPIStatus *st) {
-    CMPIStatus rc = {CMPI_RC_OK, NULL};
-    CMPIDateTime *dt = mb->eft->newDateTimeFromBinary(mb, microseconds, interval, &rc);
-    made(dt, rc, st);
-    return dt;
+/* What a broker call that reported into *rc made; null, with the failure
+ * kept, when it made nothing. */
+static void *made(void *object, const CMPIStatus *rc, CMPIStatus *st) {
+    CMPIStatus failed;
+    if (object != NULL) return object;
+    failed = *rc;
+    if (failed.rc == CMPI_RC_OK) failed.rc = CMPI_RC_ERR_FAILED;
+    keep(st, failed);
+    return NULL;
 }
 
 CMPIObjectPath *sample_path(const CMPIBroker *mb, const char *ns, const struct conf_sample *s,
                             CMPIStatus *st) {
-    CMPIObjectPath *op = new_path(mb, ns, CP_SAMPLE_CLASS, st);
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
+    CMPIObjectPath *op = made(mb->eft->newObjectPath(mb, ns, CP_SAMPLE_CLASS, &rc), &rc, st);
     CMPIValue label, slot;
     if (op == NULL) return NULL;
-    label.string = new_text(mb, s->label, st);
+    label.string = made(mb->eft->newString(mb, s->label, &rc), &rc, st);
     slot.uint16 = s->slot;
     keep(st, CP_ADD_KEY(op, "Name", s->name, CMPI_chars));
     keep(st, CP_ADD_KEY(op, "Label", &label, CMPI_string));
@@ -67,12 +36,13 @@ CMPIObjectPath *sample_path(const CMPIBroker *mb, const char *ns, const struct c
 
 static CMPIInstance *part_instance(const CMPIBroker *mb, const char *ns,
                                    const struct conf_sample *s, CMPIStatus *st) {
-    CMPIObjectPath *op = new_path(mb, ns, "Conf_Part", st);
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
+    CMPIObjectPath *op = made(mb->eft->newObjectPath(mb, ns, "Conf_Part", &rc), &rc, st);
     CMPIInstance *ci;
     CMPIValue size;
     if (op == NULL) return NULL;
     keep(st, CP_ADD_KEY(op, "Id", s->part_id, CMPI_chars));
-    ci = new_instance(mb, op, st);
+    ci = made(mb->eft->newInstance(mb, op, &rc), &rc, st);
     if (ci == NULL) return NULL;
     size.uint32 = s->part_size;
     keep(st, CP_SET_PROPERTY(ci, "Id", s->part_id, CMPI_chars));
@@ -82,13 +52,14 @@ static CMPIInstance *part_instance(const CMPIBroker *mb, const char *ns,
 
 /* Names[], Counts[] with elements left unset, and the empty Nothing[]. */
 static void set_arrays(const CMPIBroker *mb, const CMPIInstance *ci, CMPIStatus *st) {
-    CMPIArray *names = new_array(mb, CONF_NAMES_SIZE, CMPI_chars, st);
-    CMPIArray *counts = new_array(mb, CONF_COUNTS_SIZE, CMPI_uint32, st);
-    CMPIArray *nothing = new_array(mb, 0, CMPI_string, st);
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
+    CMPIArray *names = made(mb->eft->newArray(mb, CONF_NAMES_SIZE, CMPI_chars, &rc), &rc, st);
+    CMPIArray *counts = made(mb->eft->newArray(mb, CONF_COUNTS_SIZE, CMPI_uint32, &rc), &rc, st);
+    CMPIArray *nothing = made(mb->eft->newArray(mb, 0, CMPI_string, &rc), &rc, st);
     CMPIValue v;
     if (names == NULL || counts == NULL || nothing == NULL) return;
     keep(st, CP_SET_ELEMENT(names, 0, CONF_NAMES_0, CMPI_chars));
-    v.string = new_text(mb, CONF_NAMES_2, st);
+    v.string = made(mb->eft->newString(mb, CONF_NAMES_2, &rc), &rc, st);
     keep(st, CP_SET_ELEMENT(names, 2, &v, CMPI_string));
     v.uint32 = CONF_COUNTS_0;
     keep(st, CP_SET_ELEMENT(counts, 0, &v, CMPI_uint32));
@@ -104,17 +75,18 @@ static void set_arrays(const CMPIBroker *mb, const CMPIInstance *ci, CMPIStatus 
 
 CMPIInstance *sample_instance(const CMPIBroker *mb, const char *ns, const struct conf_sample *s,
                               CMPIStatus *st) {
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
     CMPIObjectPath *op = sample_path(mb, ns, s, st);
-    CMPIInstance *ci = op != NULL ? new_instance(mb, op, st) : NULL;
+    CMPIInstance *ci = op != NULL ? made(mb->eft->newInstance(mb, op, &rc), &rc, st) : NULL;
     CMPIValue v;
     if (ci == NULL) return NULL;
     keep(st, CP_SET_PROPERTY(ci, "Name", s->name, CMPI_chars));
-    v.string = new_text(mb, s->label, st);
+    v.string = made(mb->eft->newString(mb, s->label, &rc), &rc, st);
     keep(st, CP_SET_PROPERTY(ci, "Label", &v, CMPI_string));
     v.uint16 = s->slot;
     keep(st, CP_SET_PROPERTY(ci, "Slot", &v, CMPI_uint16));
     keep(st, CP_SET_PROPERTY(ci, "Text", s->text, CMPI_chars));
-    v.string = new_text(mb, s->made, st);
+    v.string = made(mb->eft->newString(mb, s->made, &rc), &rc, st);
     keep(st, CP_SET_PROPERTY(ci, "Made", &v, CMPI_string));
     keep(st, CP_SET_PROPERTY(ci, "Missing", NULL, CMPI_chars));
     v.boolean = s->enabled;
@@ -125,9 +97,9 @@ CMPIInstance *sample_instance(const CMPIBroker *mb, const char *ns, const struct
     keep(st, CP_SET_PROPERTY(ci, "Offset", &v, CMPI_sint64));
     v.real64 = s->ratio;
     keep(st, CP_SET_PROPERTY(ci, "Ratio", &v, CMPI_real64));
-    v.dateTime = new_datetime(mb, s->taken, 0, st);
+    v.dateTime = made(mb->eft->newDateTimeFromBinary(mb, s->taken, 0, &rc), &rc, st);
     keep(st, CP_SET_PROPERTY(ci, "Taken", &v, CMPI_dateTime));
-    v.dateTime = new_datetime(mb, s->uptime, 1, st);
+    v.dateTime = made(mb->eft->newDateTimeFromBinary(mb, s->uptime, 1, &rc), &rc, st);
     keep(st, CP_SET_PROPERTY(ci, "Uptime", &v, CMPI_dateTime));
     set_arrays(mb, ci, st);
     v.inst = part_instance(mb, ns, s, st);
@@ -136,7 +108,8 @@ CMPIInstance *sample_instance(const CMPIBroker *mb, const char *ns, const struct
 }
 
 CMPIObjectPath *peer_path(const CMPIBroker *mb, const char *ns, CMPIStatus *st) {
-    CMPIObjectPath *op = new_path(mb, ns, CP_PEER_CLASS, st);
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
+    CMPIObjectPath *op = made(mb->eft->newObjectPath(mb, ns, CP_PEER_CLASS, &rc), &rc, st);
     CMPIValue antecedent, dependent;
     antecedent.ref = sample_path(mb, ns, &conf_samples[0], st);
     dependent.ref = sample_path(mb, ns, &conf_samples[1], st);
@@ -147,8 +120,9 @@ CMPIObjectPath *peer_path(const CMPIBroker *mb, const char *ns, CMPIStatus *st) 
 }
 
 CMPIInstance *peer_instance(const CMPIBroker *mb, const char *ns, CMPIStatus *st) {
+    CMPIStatus rc = {CMPI_RC_OK, NULL};
     CMPIObjectPath *op = peer_path(mb, ns, st);
-    CMPIInstance *ci = op != NULL ? new_instance(mb, op, st) : NULL;
+    CMPIInstance *ci = op != NULL ? made(mb->eft->newInstance(mb, op, &rc), &rc, st) : NULL;
     CMPIValue v;
     if (ci == NULL) return NULL;
     v.ref = sample_path(mb, ns, &conf_samples[0], st);
