@@ -26,6 +26,14 @@ PlatformCall list(int node) {
     };
 }
 
+// An entry of a list of three.
+PlatformCall param(int index) {
+    return [=] {
+        const List list = listOf({"vmk0", "vmk1", "vmk2"});
+        return PRB_ParamListGetParam(list.get(), index) != nullptr ? ok : failed;
+    };
+}
+
 const PlatformCall checkSig = [] {
     char area[21];
     return PRB_CheckSig(area, sizeof area, nullptr);
@@ -60,6 +68,8 @@ TEST_F(HostSimFaults, EachRuleFailsExactlyTheCallsItNames) {
         {{{"call", "PRB_CheckSig"}, {"nth", 1}}, {checkSig, checkSig}, {failed, ok}},
         {{{"call", "PRB_GetInstanceListAlloc"}, {"node", 608}}, {list(608), list(607)}, {failed, ok}},
         {{{"call", "PRB_GetInstanceListAlloc"}, {"node", 607}, {"noList", true}}, {list(607), list(608)}, {noList, ok}},
+        {{{"call", "PRB_ParamListGetParam"}, {"index", 1}}, {param(0), param(1), param(2), param(1)},
+         {ok, failed, ok, failed}},
     };
     for (const auto &[rule, calls, statuses] : cases) {
         serveWith(rule);

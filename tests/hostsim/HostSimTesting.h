@@ -43,15 +43,24 @@ inline List instanceList(int node, int *status = nullptr) {
     return List(list);
 }
 
-inline std::vector<std::string> servedAdapterNames() {
+// The texts of the instance list of `node` under a parent list holding
+// `parent` (none when empty); no names when the list cannot be had.
+inline std::vector<std::string> listedNames(int node, const std::vector<Param> &parent = {}) {
+    const List parentList = parent.empty() ? List() : listOf(parent);
+    PRB_ParamList *listed = nullptr;
+    PRB_GetInstanceListAlloc(node, parentList.get(), &listed);
+    const List list(listed);
     std::vector<std::string> names;
-    const List list = instanceList(70);
     for (int i = 0; i < PRB_ParamListUsedCount(list.get()); ++i) {
         char *name = nullptr;
         EXPECT_EQ(PRB_ParamListGetString(list.get(), i, &name), 0);
-        names.push_back(name);
+        names.push_back(name == nullptr ? "" : name);
     }
     return names;
+}
+
+inline std::vector<std::string> servedAdapterNames() {
+    return listedNames(70);
 }
 
 // PRB_Get of `node` for a list of `params` into `buffer`.

@@ -40,6 +40,16 @@ void expectRecord(int node, const std::vector<Param> &params, std::size_t size, 
     for (std::size_t i = 0; i < size; ++i) EXPECT_TRUE(inField[i] || record[i] == 0) << node << ": byte " << i;
 }
 
+// A stem ending in a digit, so a name can be split more than one way.
+const nlohmann::json interfaces = nlohmann::json::array({
+    {{"name", "probe"}, {"ipv4Address", "192.168.10.21"}, {"ipv4Netmask", "255.255.255.0"},
+     {"ipv6", {{{"address", "fe80::1"}},
+               {{"instance", "b"}, {"address", alphabet}, {"prefixLength", "0x11223344"}},
+               {{"address", alphabet.substr(0, 48)}, {"prefixLength", 0}}}}},
+    {{"name", "v6only"}, {"ipv6", {{{"address", "2001:db8::5"}, {"prefixLength", 48}}}}},
+    {{"name", "vmk1"}, {"count", 11}, {"ipv4Address", "10.0.0.1"}},
+});
+
 using HostSimNodes = HostSimTest;
 
 // Texts: a short one zero-padded, one exactly as wide as its field, and
@@ -80,6 +90,27 @@ TEST_F(HostSimNodes, ProcessorRecordsCarryEveryRegisterAndCutTheirTexts) {
     for (const auto &[node, size] : {std::pair{605, 36}, {606, 48}, {1443, 588}}) expectRecord(node, {}, size, {});
 }
 
+// Counted interfaces share their entry's addresses and are found by their
+// computed names; the IPv6 record carries the address text as the adapter
+// record carries its texts.
+TEST_F(HostSimNodes, InterfaceNodesServeListsAndRecords) {
+    serve({{"hostType", "Corlai"}, {"ipInterfaces", interfaces}});
+    std::vector<std::string> names = {"probe", "v6only"};
+    for (int n = 0; n < 11; ++n) names.push_back("vmk1" + std::to_string(n));
+    EXPECT_EQ(listedNames(214), names);
+    EXPECT_EQ(listedNames(243, {"probe"}), (std::vector<std::string>{"0", "b", "2"}));
+    EXPECT_EQ(listedNames(243, {"v6only"}), std::vector<std::string>{"0"});
+    EXPECT_EQ(listedNames(243, {"vmk110"}), std::vector<std::string>{});
+    expectRecord(239, {"probe"}, 4, {{0, {192, 168, 10, 21}}});
+    expectRecord(240, {"probe"}, 4, {{0, {255, 255, 255, 0}}});
+    expectRecord(239, {"vmk110"}, 4, {{0, {10, 0, 0, 1}}});
+    expectRecord(240, {"vmk110"}, 4, {});
+    expectRecord(244, {"probe", "0"}, 68, {{0, textField("fe80::1", 48)}, {48, word(64)}});
+    expectRecord(244, {"probe", "b"}, 68, {{0, textField(alphabet, 48)}, {48, word(0x11223344)}});
+    expectRecord(244, {"probe", "2"}, 68, {{0, textField(alphabet, 48)}});
+    expectRecord(244, {"v6only", "0"}, 68, {{0, textField("2001:db8::5", 48)}, {48, word(48)}});
+}
+
 TEST_F(HostSimNodes, BadRequestsFailWithTheirStatusAndLeaveTheBufferAlone) {
     const std::tuple<const char *, int, std::vector<Param>, std::size_t, int> cases[] = {
         {"record one byte short", 72, {"vmnic0"}, 1251, HOSTSIM_STATUS_BAD_SIZE},
@@ -93,20 +124,41 @@ TEST_F(HostSimNodes, BadRequestsFailWithTheirStatusAndLeaveTheBufferAlone) {
         {"core named by text", 607, {"0"}, 200, HOSTSIM_STATUS_BAD_ARGUMENT},
         {"no core named", 800, {}, 76, HOSTSIM_STATUS_BAD_ARGUMENT},
         {"host-wide node with a parameter", 606, {std::int64_t{0}}, 48, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"address of an interface without IPv4", 239, {"v6only"}, 4, HOSTSIM_STATUS_NOT_FOUND},
+        {"netmask of an interface without IPv4", 240, {"v6only"}, 4, HOSTSIM_STATUS_NOT_FOUND},
+        {"a name that only splits like a counted one", 239, {"vmk1"}, 4, HOSTSIM_STATUS_NOT_FOUND},
+        {"past the count", 239, {"vmk111"}, 4, HOSTSIM_STATUS_NOT_FOUND},
+        {"netmask one byte long", 240, {"probe"}, 5, HOSTSIM_STATUS_BAD_SIZE},
+        {"IPv6 record one byte short", 244, {"probe", "0"}, 67, HOSTSIM_STATUS_BAD_SIZE},
+        {"unknown IPv6 instance", 244, {"probe", "9"}, 68, HOSTSIM_STATUS_NOT_FOUND},
+        {"IPv6 record of an unknown interface", 244, {"vmk9", "0"}, 68, HOSTSIM_STATUS_NOT_FOUND},
+        {"IPv6 record named by the interface alone", 244, {"probe"}, 68, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"IPv6 instance named by an integer", 244, {"probe", std::int64_t{0}}, 68, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"IPv4 address asked with the instance too", 239, {"probe", "0"}, 4, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"interface list as a value", 214, {}, 4, HOSTSIM_STATUS_UNKNOWN_NODE},
     };
-    serve(host({{{"name", "vmnic0"}}}, {}, {{"packages", {{{"cores", {{{"count", 4}}}}}}}}));
+    nlohmann::json profile = host({{{"name", "vmnic0"}}}, {}, {{"packages", {{{"cores", {{{"count", 4}}}}}}}});
+    profile["ipInterfaces"] = interfaces;
+    serve(profile);
     for (const auto &[what, node, params, size, status] : cases) {
         Bytes buffer(size, 0xa5);
         EXPECT_EQ(readNode(node, params, buffer), status) << what;
         EXPECT_EQ(buffer, Bytes(size, 0xa5)) << what;
     }
+    const std::tuple<const char *, int, std::vector<Param>, int> listCases[] = {
+        {"node without a list", 72, {}, HOSTSIM_STATUS_UNKNOWN_NODE},
+        {"core list with a parent", 607, {std::int64_t{0}}, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"interface list with a parent", 214, {"probe"}, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"IPv6 list without an interface", 243, {}, HOSTSIM_STATUS_BAD_ARGUMENT},
+        {"IPv6 list of an unknown interface", 243, {"vmk9"}, HOSTSIM_STATUS_NOT_FOUND},
+    };
+    for (const auto &[what, node, params, status] : listCases) {
+        const List parent = listOf(params);
+        PRB_ParamList *list = nullptr;
+        EXPECT_EQ(PRB_GetInstanceListAlloc(node, parent.get(), &list), status) << what;
+        EXPECT_EQ(list, nullptr) << what;
+    }
     int status = -1;
-    EXPECT_EQ(instanceList(72, &status), nullptr);
-    EXPECT_EQ(status, HOSTSIM_STATUS_UNKNOWN_NODE);
-    const List parent = listOf({std::int64_t{0}});
-    PRB_ParamList *list = nullptr;
-    EXPECT_EQ(PRB_GetInstanceListAlloc(607, parent.get(), &list), HOSTSIM_STATUS_BAD_ARGUMENT);
-    EXPECT_EQ(list, nullptr);
     char workArea[21];
     EXPECT_EQ(PRB_CheckSig(workArea, 20, &status), HOSTSIM_STATUS_BAD_ARGUMENT);
     EXPECT_EQ(PRB_CheckSig(workArea, 21, &status), HOSTSIM_STATUS_OK);

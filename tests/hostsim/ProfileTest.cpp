@@ -45,6 +45,23 @@ TEST_F(HostSimProfiles, GarbledProfilesAreRefusedNamingTheField) {
         {withCores(R"({"instance": 2147483648})"),
          "processors.packages[1].cores[0].instance: expected an integer from -2147483648 to 2147483647"},
         {withCores(R"({"count": 100000}, {})"), "processors: more than 100000 cores"},
+        {with("ipInterfaces", R"([{"name": ")" + std::string(256, 'n') + R"("}])"),
+         "ipInterfaces[0].name: expected a text of at most 255 bytes, got 256"},
+        {with("ipInterfaces", R"([{"name": "vmk", "count": 11}, {"name": "vmk1", "count": 1}])"),
+         R"(ipInterfaces[1].name: duplicate interface name "vmk10")"},
+        {with("ipInterfaces", R"([{"name": "vmk10"}, {"name": "vmk", "count": 11}])"),
+         R"(ipInterfaces[1].name: duplicate interface name "vmk10")"},
+        {with("ipInterfaces", R"([{"name": "a", "ipv4Address": "300.1.2.3"}])"),
+         R"(ipInterfaces[0].ipv4Address: expected a dotted-decimal IPv4 address such as "192.168.0.1", )"
+         R"(got "300.1.2.3")"},
+        {with("ipInterfaces", "[{\"name\": \"a\", \"ipv4Address\": \"1.2.3.4\\u0000\"}]"),
+         "ipInterfaces[0].ipv4Address: expected a dotted-decimal IPv4 address"},
+        {with("ipInterfaces", R"([{"name": "a", "ipv4Netmask": "255.0.0.0"}])"),
+         "ipInterfaces[0].ipv4Netmask: given without ipv4Address"},
+        {with("ipInterfaces", R"([{"name": "a", "ipv6": [{"address": "::1"}, {"instance": "0", "address": "::2"}]}])"),
+         R"(ipInterfaces[0].ipv6[1].instance: duplicate IPv6 instance "0")"},
+        {with("ipInterfaces", R"([{"name": "a", "count": 100000}, {"name": "b"}])"),
+         "ipInterfaces: more than 100000 interfaces"},
     };
     serve(host({{{"name", "kept"}}}));
     for (const auto &[json, message] : cases) EXPECT_THAT(loadError(json), StartsWith(message)) << json;

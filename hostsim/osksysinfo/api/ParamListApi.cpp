@@ -90,6 +90,7 @@ int PRB_ParamListGetInt32(PRB_ParamList *list, int index, int32_t *value) {
 }
 
 PRB_Param *PRB_ParamListGetParam(PRB_ParamList *list, int index) {
+    if (list == nullptr || injected(Operation::ParamListGetParam, index)) return nullptr;
     return entryAt(list, index);
 }
 

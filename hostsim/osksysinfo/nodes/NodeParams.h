@@ -1,6 +1,7 @@
 // How nodes and fault rules read the parameter list of a call.
 #pragma once
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <variant>
@@ -21,12 +22,18 @@ int readWithoutParams(const PRB_ParamList *params, Encode encode) {
     return HOSTSIM_STATUS_OK;
 }
 
-// The list's only parameter when it is a `Value` (a text or an integer);
-// null otherwise.
+// Parameter `index` of a list of exactly `count` parameters when it is a
+// `Value` (a text or an integer); null otherwise.
+template <typename Value>
+const Value *paramAt(const PRB_ParamList *list, std::size_t index, std::size_t count) {
+    if (list == nullptr || list->entries.size() != count || index >= count) return nullptr;
+    return std::get_if<Value>(&list->entries[index].value);
+}
+
+// The list's only parameter when it is a `Value`; null otherwise.
 template <typename Value>
 const Value *soleParam(const PRB_ParamList *list) {
-    if (list == nullptr || list->entries.size() != 1) return nullptr;
-    return std::get_if<Value>(&list->entries.front().value);
+    return paramAt<Value>(list, 0, 1);
 }
 
 // The last parameter as text, integers in decimal: the instance a call is

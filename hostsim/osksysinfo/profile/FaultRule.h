@@ -16,6 +16,7 @@ enum class Operation {
     ParamListAddInt,
     ParamListGetString,
     ParamListGetInt32,
+    ParamListGetParam,
 };
 
 // One platform call as fault rules see it. `number` is the node, index or

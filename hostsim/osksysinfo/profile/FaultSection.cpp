@@ -25,6 +25,7 @@ const CallKind callKinds[] = {
     {"PRB_ParamListAddInt", Operation::ParamListAddInt, "value", nullptr},
     {"PRB_ParamListGetString", Operation::ParamListGetString, "index", nullptr},
     {"PRB_ParamListGetInt32", Operation::ParamListGetInt32, "index", nullptr},
+    {"PRB_ParamListGetParam", Operation::ParamListGetParam, "index", nullptr},
 };
 
 const CallKind &readCallKind(JsonObjectReader &entry) {

@@ -8,6 +8,7 @@
 
 #include "profile/AdapterProfile.h"
 #include "profile/FaultRule.h"
+#include "profile/InterfaceTable.h"
 #include "profile/ProcessorProfile.h"
 
 namespace hostsim {
@@ -18,6 +19,7 @@ struct HostProfile {
     std::vector<AdapterProfile> adapters;  // in instance-list order
     std::unordered_map<std::string, std::size_t> adapterIndex;  // name -> position in adapters
     ProcessorProfile processors;
+    InterfaceTable interfaces;
     std::vector<FaultRule> faults;
 
     const AdapterProfile *findAdapter(const std::string &name) const {

@@ -38,6 +38,7 @@ HostProfile parseProfile(const std::string &json) {
     profile.serviceConsole = readServiceConsole(host);
     readAdapters(host, profile);
     readProcessors(host, profile);
+    readInterfaces(host, profile);
     readFaults(host, profile);
     host.finish();
     return profile;
