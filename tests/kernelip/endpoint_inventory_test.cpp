@@ -1,0 +1,142 @@
+// The endpoint walk against the stand-in host: per interface its IPv4
+// record, then its IPv6 records; every fault giving its result with the
+// records read before it, the status word deciding the result of a walk
+// that reaches its end, and every list freed on every path.
+#include <arpa/inet.h>
+
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "hostsim/HostSimControl.h"
+#include "kernelip/GetEndpointDetails.h"
+
+namespace TVX {
+namespace {
+
+// "vmk0 192.168.10.21/255.255.255.0" or "vmk0 fe80::1/64".
+std::string describe(const endpointDetails &record) {
+    if (record.protocolType == protocolIPv6) {
+        return std::string(record.name) + " " + record.ipv6Address + "/" + std::to_string(record.ipv6PrefixLength);
+    }
+    EXPECT_EQ(record.protocolType, protocolIPv4) << record.name;
+    char address[INET_ADDRSTRLEN];
+    char netmask[INET_ADDRSTRLEN];
+    inet_ntop(AF_INET, &record.ipv4Address, address, sizeof address);
+    inet_ntop(AF_INET, &record.ipv4Netmask, netmask, sizeof netmask);
+    return std::string(record.name) + " " + address + "/" + netmask;
+}
+
+struct Walk {
+    unsigned int result;
+    std::vector<std::string> records;
+};
+
+class EndpointInventory : public testing::Test {
+protected:
+    void SetUp() override { foreignBefore_ = HostSim_ForeignDestroyCount(); }
+    void TearDown() override {
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << "a list was not freed";
+        EXPECT_EQ(HostSim_ForeignDestroyCount(), foreignBefore_) << "something not a live list was destroyed";
+        HostSim_ResetProfile();
+    }
+
+    // Walks the host; an empty profile text walks the built-in one.
+    static Walk walk(const std::string &profile) {
+        char error[256] = "";
+        if (profile.empty()) {
+            HostSim_ResetProfile();
+        } else {
+            EXPECT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
+        }
+        std::vector<endpointDetails> endpoints;
+        Walk taken{getendpointDetails(endpoints), {}};
+        for (const endpointDetails &record : endpoints) taken.records.push_back(describe(record));
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << profile;
+        return taken;
+    }
+
+private:
+    std::size_t foreignBefore_ = 0;
+};
+
+std::string host(const std::string &interfaces, const std::string &faults) {
+    return R"({"hostType": "Corlai", "ipInterfaces": [)" + interfaces + R"(], "faults": [)" + faults + "]}";
+}
+
+const std::string threeInterfaces = R"(
+    {"name": "vmk0", "ipv4Address": "192.168.10.21", "ipv4Netmask": "255.255.255.0",
+     "ipv6": [{"instance": "a", "address": "fe80::1"},
+              {"instance": "b", "address": "2001:db8::1", "prefixLength": 48}]},
+    {"name": "vmk1", "ipv6": [{"instance": "c", "address": "2001:db8:1::5"}]},
+    {"name": "vmk2", "ipv4Address": "10.0.0.2", "ipv4Netmask": "255.0.0.0",
+     "ipv6": [{"instance": "d", "address": "fd00::2", "prefixLength": 56},
+              {"instance": "e", "address": "fd00::3", "prefixLength": 57}]})";
+const std::string v4vmk0 = "vmk0 192.168.10.21/255.255.255.0", a = "vmk0 fe80::1/64", b = "vmk0 2001:db8::1/48",
+                  c = "vmk1 2001:db8:1::5/64", v4vmk2 = "vmk2 10.0.0.2/255.0.0.0", d = "vmk2 fd00::2/56",
+                  e = "vmk2 fd00::3/57";
+
+TEST_F(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
+    const struct {
+        const char *faults;
+        unsigned int result;
+        std::vector<std::string> records;
+        std::string interfaces = threeInterfaces;
+    } cases[] = {
+        {"", 0, {v4vmk0, a, b, c, v4vmk2, d, e}},
+        {R"({"call": "PRB_Get", "node": 239, "instance": "vmk0"})", 0, {a, b, c, v4vmk2, d, e}},
+        {R"({"call": "PRB_Get", "node": 240, "instance": "vmk2"})", 1, {v4vmk0, a, b, c}},
+        // vmk1 has no address, so its netmask is never asked for.
+        {R"({"call": "PRB_Get", "node": 240, "instance": "vmk1"})", 0, {v4vmk0, a, b, c, v4vmk2, d, e}},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk0"})", 0, {v4vmk0, c, v4vmk2, d, e}},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk2"})", 0, {v4vmk0, a, b, c, v4vmk2}},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk1", "noList": true})", 0,
+         {v4vmk0, a, b, v4vmk2, d, e}},
+        {R"({"call": "PRB_Get", "node": 244, "instance": "b"})", 1, {v4vmk0, a}},
+        // Index 1 is first asked of vmk0's IPv6 list, then of the interface list.
+        {R"({"call": "PRB_ParamListGetParam", "index": 1, "nth": 1})", 0, {v4vmk0, a, c, v4vmk2, d, e}},
+        {R"({"call": "PRB_ParamListGetParam", "index": 1, "nth": 2})", 0, {v4vmk0, a, b, v4vmk2, d, e}},
+        // The status word: a name that cannot be appended fails the walk
+        // only when nothing is read after it; a null entry reads nothing.
+        {R"({"call": "PRB_ParamListAddString", "text": "vmk0"})", 0, {c, v4vmk2, d, e}},
+        {R"({"call": "PRB_ParamListAddString", "text": "vmk2"})", 1, {v4vmk0, a, b, c}},
+        {R"({"call": "PRB_ParamListAddString", "text": "d"})", 0, {v4vmk0, a, b, c, v4vmk2, e}},
+        {R"({"call": "PRB_ParamListAddString", "text": "e"})", 1, {v4vmk0, a, b, c, v4vmk2, d}},
+        {R"({"call": "PRB_ParamListAddString", "text": "vmk1"}, {"call": "PRB_ParamListGetParam", "index": 2})", 1,
+         {v4vmk0, a, b}},
+        {R"({"call": "PRB_CheckSig"})", 1, {}},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 214})", 1, {}},
+        {R"({"call": "PRB_GetInstanceListAlloc", "node": 214, "noList": true})", 0, {}},
+        {R"({"call": "PRB_ParamListCreate"})", 1, {}},
+        {"", 0, {}, ""},
+        {R"({"call": "PRB_ParamListCreate"})", 1, {}, ""},
+    };
+    for (const auto &row : cases) {
+        const Walk taken = walk(host(row.interfaces, row.faults));
+        EXPECT_EQ(taken.result, row.result) << row.faults << (row.interfaces.empty() ? " (no interfaces)" : "");
+        EXPECT_EQ(taken.records, row.records) << row.faults;
+    }
+}
+
+TEST_F(EndpointInventory, NamesAreCutAt150Characters) {
+    const std::string exact(150, 'x'), longer(153, 'y'), cut = longer.substr(0, 150);
+    const Walk taken = walk(host(R"({"name": ")" + exact + R"(", "ipv4Address": "10.0.0.1"}, {"name": ")" + longer +
+                                     R"(", "ipv4Address": "10.0.0.2", "ipv6": [{"address": "::1"}]})",
+                                 ""));
+    EXPECT_EQ(taken.result, 0u);
+    EXPECT_EQ(taken.records, (std::vector<std::string>{exact + " 10.0.0.1/0.0.0.0", cut + " 10.0.0.2/0.0.0.0",
+                                                       cut + " ::1/64"}));
+}
+
+TEST_F(EndpointInventory, BuiltInHost) {
+    const Walk taken = walk("");
+    EXPECT_EQ(taken.result, 0u);
+    EXPECT_EQ(taken.records, (std::vector<std::string>{
+                                 "vmk0 192.168.10.21/255.255.255.0", "vmk1 10.20.30.40/255.255.0.0",
+                                 "vmk1 fe80::250:56ff:fe6a:1b2c/64", "vmk1 2001:db8:10::21/48",
+                                 "vmk2 2001:db8:20::5/64", "vmk3 0.0.0.0/0.0.0.0"}));
+}
+
+}  // namespace
+}  // namespace TVX
