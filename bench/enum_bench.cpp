@@ -1,7 +1,7 @@
 // One enumInstances through the embedded broker, per class, and one
 // associators from a port, on the default host and on a large one; prints
 // the time per request and per instance, and how many times longer the
-// large host takes.
+// large host takes, per request and per instance.
 #include <benchmark/benchmark.h>
 
 #include <cstdio>
@@ -15,7 +15,11 @@ namespace {
 
 using namespace tvxbroker;
 
-std::map<std::string, double> nanosPerRequest;
+struct Figures {
+    double nanosPerRequest;
+    double instances;
+};
+std::map<std::string, Figures> figures;
 
 // Runs `request` on the host of `profileFile` (null: the default host).
 template <class Request>
@@ -73,6 +77,8 @@ const HostPair pairs[] = {
      "enumerate/processors_defaultHost", "enumerate/processors_64Packages"},
     {"associators from a port, 1,000 adapters against the default host's 2", "associate/port_defaultHost",
      "associate/port_1000Adapters"},
+    {"CIM_IPProtocolEndpoint, 4,096 interfaces against 16 (4 addresses each)", "enumerate/endpoints_16Interfaces",
+     "enumerate/endpoints_4096Interfaces"},
 };
 
 BENCHMARK_CAPTURE(enumerate, ports_defaultHost, "Talvex_EthernetPort", nullptr)
@@ -89,14 +95,23 @@ BENCHMARK_CAPTURE(enumerate, processors_64Packages, "Talvex_Processor",
                   TVX_PROFILE_DIR "/processors-many.json")
     ->Unit(benchmark::kMillisecond);
 
+BENCHMARK_CAPTURE(enumerate, endpoints_16Interfaces, "CIM_IPProtocolEndpoint",
+                  TVX_PROFILE_DIR "/interfaces-16.json")
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(enumerate, endpoints_4096Interfaces, "CIM_IPProtocolEndpoint",
+                  TVX_PROFILE_DIR "/interfaces-4096.json")
+    ->Unit(benchmark::kMillisecond);
+
 class RatioReporter : public benchmark::ConsoleReporter {
 public:
     RatioReporter() : ConsoleReporter(OO_Tabular) {}
 
     void ReportRuns(const std::vector<Run> &runs) override {
         for (const Run &run : runs) {
-            if (run.iterations > 0) nanosPerRequest[run.benchmark_name()] = run.GetAdjustedRealTime() *
-                                                                           unitNanos(run.time_unit);
+            if (run.iterations == 0) continue;
+            const auto instances = run.counters.find("instances");
+            figures[run.benchmark_name()] = {run.GetAdjustedRealTime() * unitNanos(run.time_unit),
+                                             instances != run.counters.end() ? double(instances->second) : 0};
         }
         ConsoleReporter::ReportRuns(runs);
     }
@@ -120,11 +135,13 @@ int main(int argc, char **argv) {
     benchmark::RunSpecifiedBenchmarks(&reporter);
     benchmark::Shutdown();
     for (const HostPair &pair : pairs) {
-        const auto small = nanosPerRequest.find(pair.small);
-        const auto large = nanosPerRequest.find(pair.large);
-        if (small != nanosPerRequest.end() && large != nanosPerRequest.end()) {
-            std::printf("%s: %.0f times as long\n", pair.what, large->second / small->second);
-        }
+        const auto small = figures.find(pair.small);
+        const auto large = figures.find(pair.large);
+        if (small == figures.end() || large == figures.end()) continue;
+        const double perRequest = large->second.nanosPerRequest / small->second.nanosPerRequest;
+        const double perInstance = perRequest * small->second.instances / large->second.instances;
+        std::printf("%s: %.0f times as long, %.2f times as long per instance\n", pair.what, perRequest,
+                    perInstance);
     }
     return 0;
 }
