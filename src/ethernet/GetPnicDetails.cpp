@@ -7,6 +7,7 @@
 #include "frame/BoundedText.h"
 #include "frame/LittleEndian.h"
 #include "platform/ParamList.h"
+#include "platform/SystemInfoSignature.h"
 
 namespace EthernetProvider {
 namespace {
@@ -46,9 +47,7 @@ Step readAdapter(PRB_ParamList *adapters, int index, std::vector<PnicDetails> &p
 }  // namespace
 
 unsigned int getPnicDetails(std::vector<PnicDetails> &pnics) {
-    char workArea[21] = {};
-    int signatureWord = 0;
-    if (PRB_CheckSig(workArea, sizeof workArea, &signatureWord) != 0) return failed;
+    if (!platform::systemInfoUsable()) return failed;
 
     platform::ParamList adapters;
     if (PRB_GetInstanceListAlloc(adapterListNode, nullptr, adapters.receive()) != 0) return failed;

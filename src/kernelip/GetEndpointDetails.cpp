@@ -5,6 +5,7 @@
 #include "frame/BoundedText.h"
 #include "kernelip/IPv6Record.h"
 #include "platform/ParamList.h"
+#include "platform/SystemInfoSignature.h"
 
 namespace TVX {
 namespace {
@@ -100,9 +101,7 @@ private:
 }  // namespace
 
 unsigned int getendpointDetails(std::vector<endpointDetails> &endpoints) {
-    char workArea[21] = {};
-    int signatureWord = 0;
-    if (PRB_CheckSig(workArea, sizeof workArea, &signatureWord) != 0) return failed;
+    if (!platform::systemInfoUsable()) return failed;
 
     platform::ParamList interfaces;
     if (PRB_GetInstanceListAlloc(interfaceListNode, nullptr, interfaces.receive()) != 0) return failed;

@@ -6,6 +6,7 @@
 
 #include "frame/LittleEndian.h"
 #include "platform/ParamList.h"
+#include "platform/SystemInfoSignature.h"
 #include "processor/CpuidRecord.h"
 #include "processor/HostProcessorSettings.h"
 
@@ -101,9 +102,7 @@ bool readCoreStates(PRB_ParamList *cores, uint64_t base, PRB_ParamList *params,
 }  // namespace
 
 unsigned int getProcessorDetails(std::vector<ProcessorDetails> &out) {
-    char workArea[21] = {};
-    int signatureWord = 0;
-    if (PRB_CheckSig(workArea, sizeof workArea, &signatureWord) != 0) return failed;
+    if (!platform::systemInfoUsable()) return failed;
 
     HostProcessorSettings host;
     std::memset(&host, 0, sizeof host);
