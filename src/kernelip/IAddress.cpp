@@ -1,0 +1,36 @@
+#include "kernelip/IAddress.h"
+
+#include <stdexcept>
+
+#include "platform/OmcComputerSystem.h"
+
+namespace TVX {
+namespace {
+
+std::int32_t familyOf(const ifaddrs *entry) {
+    if (entry->ifa_addr == nullptr || entry->ifa_netmask == nullptr) {
+        throw std::invalid_argument("Entry without an address or a netmask");
+    }
+    return entry->ifa_addr->sa_family;
+}
+
+}  // namespace
+
+IAddress::IAddress(const ifaddrs *entry) : family(familyOf(entry)) {}
+
+CmpiInstance IAddress::newEndpointInstance(const CmpiContext &ctx, CmpiBroker *broker,
+                                           const std::string &interfaceName,
+                                           std::int32_t protocolIFType) const {
+    const std::string className = getCreationClassName();
+    CmpiInstance instance(CmpiObjectPath(kKernelIpNamespace, className.c_str()));
+    instance.setProperty("SystemCreationClassName", CmpiData(OMC::getComputerSystemClassName()));
+    instance.setProperty("SystemName", CmpiData(OMC::getComputerSystemName(ctx, broker)));
+    instance.setProperty("CreationClassName", CmpiData(className));
+    instance.setProperty("Name", CmpiData(interfaceName));
+    instance.setProperty("ElementName", CmpiData(interfaceName));
+    instance.setProperty("NameFormat", CmpiData("Ostrakon Interface Name"));
+    instance.setProperty("ProtocolIFType", CmpiData(static_cast<CMPIUint16>(protocolIFType)));
+    return instance;
+}
+
+}  // namespace TVX
