@@ -15,3 +15,7 @@ int HostType_OSIsOSK(void) {
     HostSim_HasServiceConsole(&hasConsole);
     return hasConsole ? 0 : 1;
 }
+
+int OskuserVersion_GetSystemVersion(struct SystemVersionInfo *info) {
+    return HostSim_GetSystemVersion(info);
+}

@@ -1,24 +1,13 @@
 // Association traversal works from the paths alone: it neither takes the
 // inventory nor checks that the adapter exists.
-#include <strings.h>
-
 #include "ethernet/EthernetPortObjects.h"
 #include "ethernet/EthernetPortProvider.h"
+#include "frame/ReferenceFilters.h"
 
 namespace EthernetProvider {
-namespace {
 
-bool given(const char *filter) { return filter != nullptr && *filter != '\0'; }
-
-bool filterMisses(const char *filter, const char *expected) {
-    return given(filter) && ::strcasecmp(filter, expected) != 0;
-}
-
-bool classIsA(const CmpiString &ns, const char *className, const char *filter) {
-    return !given(filter) || CmpiObjectPath(ns, className).classPathIsA(filter);
-}
-
-}  // namespace
+using frame::classFilterAccepts;
+using frame::roleFilterMisses;
 
 CmpiStatus EthernetPortProvider::doReferences(const CmpiContext &ctx, CmpiResult &rslt,
                                               const CmpiObjectPath &op, const char *assocClass,
@@ -28,13 +17,13 @@ CmpiStatus EthernetPortProvider::doReferences(const CmpiContext &ctx, CmpiResult
     const CmpiString ns = op.getNameSpace();
 
     if (className.equalsIgnoreCase(portClass)) {
-        if (filterMisses(role, "Dependent") || filterMisses(resultRole, "Antecedent")) {
+        if (roleFilterMisses(role, "Dependent") || roleFilterMisses(resultRole, "Antecedent")) {
             return CmpiStatus(CMPI_RC_OK);
         }
-        const bool wantDriver = classIsA(ns, driverIdentityClass, resultClass) &&
-                                classIsA(ns, driverElementClass, assocClass);
-        const bool wantFirmware = classIsA(ns, firmwareIdentityClass, resultClass) &&
-                                  classIsA(ns, firmwareElementClass, assocClass);
+        const bool wantDriver = classFilterAccepts(ns, driverIdentityClass, resultClass) &&
+                                classFilterAccepts(ns, driverElementClass, assocClass);
+        const bool wantFirmware = classFilterAccepts(ns, firmwareIdentityClass, resultClass) &&
+                                  classFilterAccepts(ns, firmwareElementClass, assocClass);
         const CmpiString deviceId = getKey(op, "DeviceID");
         if (deviceId.isNull()) {
             return deviceIdNotValid();
@@ -50,8 +39,8 @@ CmpiStatus EthernetPortProvider::doReferences(const CmpiContext &ctx, CmpiResult
 
     for (const IdentityKind *kind : {&driverIdentity, &firmwareIdentity}) {
         if (!className.equalsIgnoreCase(kind->identityClass)) continue;
-        if (filterMisses(role, "Antecedent") || filterMisses(resultRole, "Dependent") ||
-            !classIsA(ns, portClass, resultClass)) {
+        if (roleFilterMisses(role, "Antecedent") || roleFilterMisses(resultRole, "Dependent") ||
+            !classFilterAccepts(ns, portClass, resultClass)) {
             return CmpiStatus(CMPI_RC_OK);
         }
         const CmpiString instanceId = getKey(op, "InstanceID");

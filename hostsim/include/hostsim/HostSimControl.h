@@ -43,6 +43,13 @@ const char *HostSim_DefaultProfileText(void);
  * When no profile can be read, sets it to 0 and returns HOSTSIM_STATUS_NO_PROFILE. */
 int HostSim_HasServiceConsole(int *hasConsole);
 
+/* The running image's version record from the profile's "systemVersion",
+ * for liboskuser's version query: 0, or the status of a fault rule for
+ * OskuserVersion_GetSystemVersion (the record then untouched), or
+ * HOSTSIM_STATUS_NO_PROFILE. */
+struct SystemVersionInfo;
+int HostSim_GetSystemVersion(struct SystemVersionInfo *info);
+
 /* Parameter lists handed out (PRB_ParamListCreate, PRB_GetInstanceListAlloc)
  * and destroyed since the process started; live = created - destroyed.
  * Destroying anything that is not a live list (twice, or a foreign pointer)

@@ -1,9 +1,11 @@
 // The control API: choosing the served profile, and the list counts.
 #include <cstdio>
+#include <cstring>
 #include <exception>
 #include <string>
 
 #include "api/ExportedApi.h"
+#include "platform/OskUser.h"
 #include "profile/DefaultProfile.h"
 #include "profile/ProfileReader.h"
 #include "serving/ListRegistry.h"
@@ -64,6 +66,23 @@ int HostSim_HasServiceConsole(int *hasConsole) {
     const std::shared_ptr<const HostProfile> profile = ProfileStore::instance().current();
     *hasConsole = profile && profile->serviceConsole ? 1 : 0;
     return profile ? HOSTSIM_STATUS_OK : HOSTSIM_STATUS_NO_PROFILE;
+}
+
+int HostSim_GetSystemVersion(struct SystemVersionInfo *info) {
+    if (info == nullptr) return HOSTSIM_STATUS_BAD_ARGUMENT;
+    const Consultation consulted = ProfileStore::instance().consult({Operation::GetSystemVersion, {}, {}});
+    if (!consulted.profile) return HOSTSIM_STATUS_NO_PROFILE;
+    if (consulted.fault) return consulted.fault->status;
+    const SystemVersionProfile &version = consulted.profile->systemVersion;
+    SystemVersionInfo record{};
+    // The profile reader keeps every text shorter than its field.
+    version.productName.copy(record.productName, sizeof record.productName - 1);
+    version.versionText.copy(record.versionText, sizeof record.versionText - 1);
+    version.infoText.copy(record.infoText, sizeof record.infoText - 1);
+    version.releaseDate.copy(record.releaseDateText, sizeof record.releaseDateText - 1);
+    record.buildNumber = version.buildNumber;
+    std::memcpy(info, &record, sizeof record);
+    return HOSTSIM_STATUS_OK;
 }
 
 size_t HostSim_LiveListCount(void) {

@@ -5,6 +5,8 @@
 #include <optional>
 #include <string>
 
+#include "hostsim/HostSimControl.h"
+
 namespace hostsim {
 
 enum class Operation {
@@ -17,6 +19,7 @@ enum class Operation {
     ParamListGetString,
     ParamListGetInt32,
     ParamListGetParam,
+    GetSystemVersion,
 };
 
 // One platform call as fault rules see it. `number` is the node, index or
@@ -34,6 +37,7 @@ struct FaultRule {
     std::optional<std::string> text;     // absent: any
     std::uint64_t nth = 0;               // fail only the nth matching call; 0: every one
     bool noList = false;                 // instance list: succeed without handing out a list
+    int status = HOSTSIM_STATUS_INJECTED;  // what a failed version query returns
 
     bool matches(const Call &call) const {
         return operation == call.operation && (!number || number == call.number) &&

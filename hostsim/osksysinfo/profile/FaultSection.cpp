@@ -26,6 +26,7 @@ const CallKind callKinds[] = {
     {"PRB_ParamListGetString", Operation::ParamListGetString, "index", nullptr},
     {"PRB_ParamListGetInt32", Operation::ParamListGetInt32, "index", nullptr},
     {"PRB_ParamListGetParam", Operation::ParamListGetParam, "index", nullptr},
+    {"OskuserVersion_GetSystemVersion", Operation::GetSystemVersion, nullptr, nullptr},
 };
 
 const CallKind &readCallKind(JsonObjectReader &entry) {
@@ -46,6 +47,10 @@ FaultRule readRule(JsonObjectReader &entry) {
     if (kind.textSelector) rule.text = entry.textOrInteger(kind.textSelector);
     rule.nth = entry.unsignedInteger("nth", 1, std::numeric_limits<std::uint64_t>::max()).value_or(0);
     if (kind.operation == Operation::GetInstanceListAlloc) rule.noList = entry.boolean("noList").value_or(false);
+    if (kind.operation == Operation::GetSystemVersion) {
+        rule.status = static_cast<int>(
+            entry.signedInteger("status", 1, std::numeric_limits<std::int32_t>::max()).value_or(rule.status));
+    }
     entry.finish();
     return rule;
 }

@@ -10,6 +10,7 @@
 #include "profile/FaultRule.h"
 #include "profile/InterfaceTable.h"
 #include "profile/ProcessorProfile.h"
+#include "profile/SystemVersionProfile.h"
 
 namespace hostsim {
 
@@ -20,6 +21,7 @@ struct HostProfile {
     std::unordered_map<std::string, std::size_t> adapterIndex;  // name -> position in adapters
     ProcessorProfile processors;
     InterfaceTable interfaces;
+    SystemVersionProfile systemVersion;
     std::vector<FaultRule> faults;
 
     const AdapterProfile *findAdapter(const std::string &name) const {

@@ -39,6 +39,7 @@ HostProfile parseProfile(const std::string &json) {
     readAdapters(host, profile);
     readProcessors(host, profile);
     readInterfaces(host, profile);
+    readSystemVersion(host, profile);
     readFaults(host, profile);
     host.finish();
     return profile;

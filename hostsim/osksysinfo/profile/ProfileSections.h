@@ -10,6 +10,7 @@ namespace hostsim {
 void readAdapters(JsonObjectReader &host, HostProfile &profile);
 void readProcessors(JsonObjectReader &host, HostProfile &profile);
 void readInterfaces(JsonObjectReader &host, HostProfile &profile);
+void readSystemVersion(JsonObjectReader &host, HostProfile &profile);
 void readFaults(JsonObjectReader &host, HostProfile &profile);
 
 }  // namespace hostsim

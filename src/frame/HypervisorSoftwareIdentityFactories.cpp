@@ -1,0 +1,131 @@
+// The hypervisor software identity provider: the running image and, on a
+// host with an alternate boot bank, that image too. Its requests are
+// serialised, as each refreshes the two version records the others read.
+#include <syslog.h>
+
+#include <vector>
+
+#include "CmpiProviderFactory.h"
+#include "platform/OmcMutex.h"
+#include "software/BootBank.h"
+#include "software/HypervisorVersions.h"
+#include "software/InstanceId.h"
+#include "software/SoftwareIdentity.h"
+
+namespace {
+
+using Software::hypervisorIdentityClass;
+using Software::makeInstanceId;
+
+const char *textOf(const CmpiString &text) { return text.isNull() ? "" : text.charPtr(); }
+
+std::string instanceIdOf(const CmpiObjectPath &cop) {
+    const CmpiData key = cop.getKey("InstanceID");
+    if (key.isNotFound() || key.isNullValue() || (key.type() != CMPI_string && key.type() != CMPI_chars)) return "";
+    return textOf(key);
+}
+
+class HypervisorSoftwareIdentity : public CmpiInstanceMI {
+public:
+    HypervisorSoftwareIdentity(const CmpiBroker &mb, const CmpiContext &ctx)
+        : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), versions(Software::bootBankFileInUse()) {}
+    ~HypervisorSoftwareIdentity() override = default;
+
+    CmpiStatus initialize(const CmpiContext &) override {
+        bootTimeMicros = Software::bootTimeMicros();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
+    CmpiStatus enumInstanceNames(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop) override {
+        const OMC::MutexLock held(lock);
+        const CmpiString className = cop.getClassName();
+        if (!className.equalsIgnoreCase(hypervisorIdentityClass)) {
+            syslog(LOG_ERR,
+                   "Talvex_HypervisorSoftwareIdentityProvider::enumInstanceNames was for %s, not the One True "
+                   "Class, %s.",
+                   textOf(className), hypervisorIdentityClass);
+            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
+        }
+        versions.gatherVersions();
+        for (const SystemVersionInfo *record : records()) {
+            CmpiObjectPath path(cop.getNameSpace(), textOf(className));
+            path.setKey("InstanceID", CmpiData(makeInstanceId(*record)));
+            rslt.returnData(path);
+        }
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
+    CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
+                             const char **properties) override {
+        const OMC::MutexLock held(lock);
+        if (!cop.getClassName().equalsIgnoreCase(hypervisorIdentityClass)) {
+            syslog(LOG_ERR,
+                   "ERR: Talvex_HypervisorSoftwareIdentityProvider::enumInstances::Throwing not supported "
+                   "error!!!!!");
+            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
+        }
+        versions.gatherVersions();
+        for (const SystemVersionInfo *record : records()) {
+            CmpiInstance instance(cop);
+            instance.setPropertyFilter(properties, nullptr);
+            Software::fillSoftwareIdentity(instance, *record, bootTimeMicros);
+            rslt.returnData(instance);
+        }
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
+    CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
+                           const char **properties) override {
+        const OMC::MutexLock held(lock);
+        const CmpiString className = cop.getClassName();
+        if (!className.equalsIgnoreCase(hypervisorIdentityClass)) {
+            syslog(LOG_ERR,
+                   "Talvex_HypervisorSoftwareIdentityProvider::getInstance was for %s, not the One True Class, "
+                   "%s.",
+                   textOf(className), hypervisorIdentityClass);
+            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
+        }
+        versions.gatherVersions();
+        CmpiInstance instance(CmpiObjectPath(cop.getNameSpace(), hypervisorIdentityClass));
+        instance.setPropertyFilter(properties, nullptr);
+        const std::string instanceId = instanceIdOf(cop);
+        const SystemVersionInfo *found = nullptr;
+        for (const SystemVersionInfo *record : records()) {
+            if (instanceId == makeInstanceId(*record)) {
+                found = record;
+                break;
+            }
+        }
+        if (found == nullptr) {
+            syslog(LOG_ERR,
+                   "Talvex_HypervisorSoftwareIdentityProvider::getInstance: Software instance not found with "
+                   "InstanceID = %s",
+                   instanceId.c_str());
+            throw CmpiStatus(CMPI_RC_ERR_NOT_FOUND);
+        }
+        Software::fillSoftwareIdentity(instance, *found, bootTimeMicros);
+        rslt.returnData(instance);
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+
+private:
+    // The running image first, then the alternate one when it is known.
+    std::vector<const SystemVersionInfo *> records() const {
+        std::vector<const SystemVersionInfo *> known{&versions.running()};
+        if (versions.altBootBank() != nullptr) known.push_back(versions.altBootBank());
+        return known;
+    }
+
+    Software::HypervisorVersions versions;
+    OMC::Mutex lock;
+    std::uint64_t bootTimeMicros = 0;
+};
+
+}  // namespace
+
+CMProviderBase(HypervisorSoftwareIdentity);
+
+CMInstanceMIFactory(HypervisorSoftwareIdentity, HypervisorSoftwareIdentity)
