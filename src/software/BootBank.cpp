@@ -3,6 +3,7 @@
 #include <cctype>
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 #include <limits>
 #include <optional>
 #include <vector>
@@ -19,7 +20,8 @@ struct FileCloser {
     void operator()(std::FILE *file) const { std::fclose(file); }
 };
 
-// The value of the first line that starts with "build=", NUL bytes and all.
+// The value of the first line that starts with "build=", up to a NUL byte
+// if the line holds one.
 std::optional<std::string> firstBuildValue(std::FILE *file) {
     char *line = nullptr;
     std::size_t capacity = 0;
@@ -29,6 +31,7 @@ std::optional<std::string> firstBuildValue(std::FILE *file) {
         const std::string text(line, static_cast<std::size_t>(length));
         if (text.compare(0, buildPrefixLength, buildPrefix) == 0) {
             value = text.substr(buildPrefixLength);
+            value->resize(std::strlen(value->c_str()));
             break;
         }
     }

@@ -1,8 +1,8 @@
 #include "SyslogCapture.h"
+#include "SyslogRecording.h"
 
 #include <syslog.h>
 
-#include <cstdarg>
 #include <cstdio>
 #include <mutex>
 
@@ -27,18 +27,16 @@ void PrintTo(const LoggedLine &line, std::ostream *os) {
     *os << "\"}";
 }
 
-}  // namespace syslogcapture
-
-extern "C" void __wrap_syslog(int priority, const char *format, ...) {
-    va_list args;
-    va_start(args, format);
+void capture(int priority, const char *format, va_list args) {
     va_list measuring;
     va_copy(measuring, args);
     const int length = std::vsnprintf(nullptr, 0, format, measuring);
     va_end(measuring);
     std::string text(length > 0 ? static_cast<std::size_t>(length) : 0, '\0');
     std::vsnprintf(text.data(), text.size() + 1, format, args);
-    va_end(args);
-    const std::lock_guard<std::mutex> lock(syslogcapture::loggedMutex);
-    syslogcapture::logged.push_back({priority, text});
+    const std::lock_guard<std::mutex> lock(loggedMutex);
+    logged.push_back({priority, text});
 }
+
+}  // namespace syslogcapture
+

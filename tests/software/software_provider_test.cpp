@@ -1,0 +1,176 @@
+// Talvex_HypervisorSoftwareIdentity through the embedded broker and the
+// shipped library, which logs into this test (it exports syslog): the two
+// images as clients see them, the answers and log lines for another class
+// and an unknown image, and requests on several threads at once.
+#include <syslog.h>
+
+#include <algorithm>
+#include <atomic>
+#include <cstdio>
+#include <ctime>
+#include <fstream>
+#include <functional>
+#include <thread>
+
+#include "ProductBroker.h"
+#include "SyslogCapture.h"
+
+namespace {
+
+using namespace producttest;
+using syslogcapture::LoggedLine;
+using syslogcapture::takeLoggedLines;
+
+constexpr const char *kClass = "Talvex_HypervisorSoftwareIdentity";
+constexpr const char *kUnserved = "Test_UnservedSoftware";
+constexpr const char *kRunningId = "Talvex Corlai 5.1.0 build-1483097";
+constexpr const char *kAltId = "Alt Boot Bank: Talvex Corlai 5.1.0 build-654321";
+
+std::string host(const char *type, const std::string &systemVersion = "{}") {
+    return std::string(R"({"hostType": ")") + type + R"(", "systemVersion": )" + systemVersion + "}";
+}
+
+ObjectPath imagePath(const std::string &instanceId, const char *cls = kClass) {
+    return ObjectPath{"", kNs, cls, {{"InstanceID", CimValue::makeString(instanceId)}}};
+}
+
+class SoftwareProvider : public ProductBroker {
+protected:
+    SoftwareProvider() : ProductBroker(kClass, kUnserved) {}
+
+    void SetUp() override {
+        bootCfg = testing::TempDir() + "software_provider_" + std::to_string(::getpid()) + ".cfg";
+        writeBootCfg("build=5.1.0-0.0.654321\n");
+        ::setenv("TVX_ALTBOOTBANK_CFG", bootCfg.c_str(), 1);
+        ProductBroker::SetUp();
+        takeLoggedLines();
+    }
+    void TearDown() override {
+        ProductBroker::TearDown();
+        ::unsetenv("TVX_ALTBOOTBANK_CFG");
+        std::remove(bootCfg.c_str());
+    }
+    void writeBootCfg(const std::string &content) const { std::ofstream(bootCfg) << content; }
+
+    std::vector<std::map<std::string, std::string>> enumerate() const {
+        const Response response = broker->enumInstances(classPath(kClass), {});
+        EXPECT_TRUE(response.ok()) << response.rc;
+        std::vector<std::map<std::string, std::string>> shown;
+        for (const Instance &instance : response.instances) shown.push_back(literals(instance));
+        return shown;
+    }
+
+    std::string bootCfg;
+};
+
+TEST_F(SoftwareProvider, AnotherClassIsLoggedAndNotSupportedByEveryOperation) {
+    serve(host("Corlai"));
+    const std::string onlyOne = "Talvex_HypervisorSoftwareIdentity";
+    const struct {
+        std::function<Response()> request;
+        std::string logged;
+    } cases[] = {
+        {[&] { return broker->enumInstanceNames(classPath(kUnserved)); },
+         "Talvex_HypervisorSoftwareIdentityProvider::enumInstanceNames was for Test_UnservedSoftware, not the "
+         "One True Class, " + onlyOne + "."},
+        {[&] { return broker->enumInstances(classPath(kUnserved), {}); },
+         "ERR: Talvex_HypervisorSoftwareIdentityProvider::enumInstances::Throwing not supported error!!!!!"},
+        {[&] { return broker->getInstance(imagePath(kRunningId, kUnserved), {}); },
+         "Talvex_HypervisorSoftwareIdentityProvider::getInstance was for Test_UnservedSoftware, not the One "
+         "True Class, " + onlyOne + "."},
+    };
+    for (const auto &c : cases) {
+        const Response response = c.request();
+        EXPECT_EQ(response.rc, CMPI_RC_ERR_NOT_SUPPORTED) << c.logged;
+        EXPECT_FALSE(response.message.has_value()) << c.logged;
+        EXPECT_TRUE(response.instances.empty() && response.paths.empty()) << c.logged;
+        EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, c.logged}}));
+    }
+}
+
+TEST_F(SoftwareProvider, BothImagesOnACorlaiHostAndOnlyTheRunningOneOnACorlaHost) {
+    const struct {
+        const char *hostType;
+        std::vector<std::string> ids;
+    } cases[] = {
+        // The provider keeps the boot bank it read last, so the host without
+        // one comes first.
+        {"Corla", {"Talvex Corla 5.1.0 build-1483097"}},
+        {"Corlai", {kRunningId, kAltId}},
+    };
+    for (const auto &c : cases) {
+        serve(host(c.hostType));
+        const Response names = broker->enumInstanceNames(classPath(kClass));
+        ASSERT_TRUE(names.ok());
+        std::vector<std::string> ids;
+        for (const ObjectPath &path : names.paths) ids.push_back(path.key("InstanceID")->text);
+        EXPECT_EQ(ids, c.ids) << c.hostType;
+        for (const std::string &id : c.ids) {
+            const Response got = broker->getInstance(imagePath(id), {});
+            ASSERT_EQ(got.rc, CMPI_RC_OK) << id;
+            EXPECT_EQ(got.instances.at(0).property("InstanceID")->text, id);
+        }
+        for (const std::string &unknown : {std::string(kAltId), std::string("nope"), std::string(kRunningId) + " "}) {
+            if (std::find(c.ids.begin(), c.ids.end(), unknown) != c.ids.end()) continue;
+            EXPECT_EQ(broker->getInstance(imagePath(unknown), {}).rc, CMPI_RC_ERR_NOT_FOUND) << unknown;
+            EXPECT_EQ(takeLoggedLines(),
+                      (std::vector<LoggedLine>{{LOG_ERR,
+                                                "Talvex_HypervisorSoftwareIdentityProvider::getInstance: Software "
+                                                "instance not found with InstanceID = " + unknown}}));
+        }
+    }
+    EXPECT_TRUE(takeLoggedLines().empty());
+}
+
+TEST_F(SoftwareProvider, PropertiesOfTheRunningAndTheAlternateImage) {
+    writeBootCfg("build=5.1-x\n");
+    serve(host("Corlai", R"({"versionText": "6.5.4", "releaseDate": "jul 12 2012"})"));
+    std::tm january{};
+    january.tm_year = 112;
+    january.tm_mday = 12;
+    const std::time_t midnight = std::mktime(&january);
+    char utc[32];
+    std::strftime(utc, sizeof utc, "\"%Y%m%d%H%M%S.000000+000\"", std::gmtime(&midnight));
+
+    const auto instances = enumerate();
+    ASSERT_EQ(instances.size(), 2u);
+    const auto &running = instances[0];
+    const auto &alternate = instances[1];
+    EXPECT_EQ(running.at("Name"), "\"Talvex Corlai\"");
+    EXPECT_EQ(running.at("ReleaseDate"), utc);
+    EXPECT_EQ(running.count("LastStartTime"), 1u);
+    EXPECT_EQ(running.at("MajorVersion"), "6");
+    EXPECT_EQ(running.at("MinorVersion"), "5");
+    EXPECT_EQ(running.at("RevisionNumber"), "4");
+    EXPECT_EQ(running.at("IsEntity"), "TRUE");
+    EXPECT_EQ(running.at("Manufacturer"), "\"Talvex, Inc.\"");
+    EXPECT_EQ(alternate.at("Name"), "\"Talvex Corlai Alternate Boot Bank\"");
+    EXPECT_EQ(alternate.at("Caption"), alternate.at("Name"));
+    EXPECT_EQ(alternate.at("ElementName"), "\"Alt Boot Bank: Talvex Corlai 5.1 build-4294967295\"");
+    EXPECT_EQ(alternate.at("LargeBuildNumber"), "4294967295");
+    EXPECT_EQ(alternate.at("VersionString"), "\"5.1 build-4294967295\"");
+    for (const char *absent : {"LastStartTime", "ReleaseDate", "MajorVersion", "MinorVersion", "RevisionNumber"}) {
+        EXPECT_EQ(alternate.count(absent), 0u) << absent;
+    }
+}
+
+// Each request rewrites the version records the others read; the
+// provider's lock keeps them apart (a race shows under ThreadSanitizer).
+TEST_F(SoftwareProvider, ConcurrentRequestsEachSeeBothImages) {
+    serve(host("Corlai"));
+    std::vector<std::thread> clients;
+    std::atomic<int> complete{0};
+    for (int t = 0; t < 4; ++t) {
+        clients.emplace_back([&, t] {
+            for (int i = 0; i < 15; ++i) {
+                const Response response = t % 2 == 0 ? broker->enumInstances(classPath(kClass), {})
+                                                     : broker->getInstance(imagePath(kAltId), {});
+                if (response.ok() && response.instances.size() == (t % 2 == 0 ? 2u : 1u)) ++complete;
+            }
+        });
+    }
+    for (std::thread &client : clients) client.join();
+    EXPECT_EQ(complete.load(), 60);
+}
+
+}  // namespace
