@@ -9,4 +9,6 @@ cd "$(dirname "${BASH_SOURCE[0]}")/.."
 scripts/setup.sh
 cmake --preset dev
 cmake --build --preset dev -j2
+# The simulated host's alternate boot bank, unless the caller chose one.
+export TVX_ALTBOOTBANK_CFG="${TVX_ALTBOOTBANK_CFG:-$PWD/hostsim/altbootbank/boot.cfg}"
 exec build/dev/broker/tvxcim "$@" demo

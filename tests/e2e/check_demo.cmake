@@ -2,7 +2,8 @@
 # one file (`tvxcim demo > log 2>&1`), and checks that each line the instance
 # factories write to standard error stands on its own line, and that what
 # the demo shows is the default host's ports, identities and associations,
-# its kernel IP endpoints, its two processor packages, and at the end this
+# its kernel IP endpoints, its two processor packages, both hypervisor
+# images (the alternate one from the simulated boot bank), and at the end this
 # host's first heartbeat.
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
 set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
@@ -35,6 +36,8 @@ set(expected
   "instance of Talvex_KernelIPv6ProtocolEndpoint\n[^}]*Name = \"vmk1\";[^}]*IPv6Address = \"2001:db8:10::21\";\n    PrefixLength = 48;"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-0\";[^}]*Vendor = 2;"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-1\";[^}]*Vendor = 3;"
+  "instance of Talvex_HypervisorSoftwareIdentity\n[^}]*InstanceID = \"Talvex Corlai 5.1.0 build-1483097\";[^}]*LastStartTime = "
+  "instance of Talvex_HypervisorSoftwareIdentity\n[^}]*InstanceID = \"Alt Boot Bank: Talvex Corlai 5.1.0 build-799733\";"
   "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
   "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"")
 foreach(pattern IN LISTS expected)
