@@ -1,0 +1,129 @@
+// Talvex_InstalledSoftwareIdentity through the embedded broker and the
+// shipped library, as far as the association's instance side goes: the
+// software side comes from the software identity provider by up-calls, and
+// the alternate boot bank's image is never installed software.
+#include <unistd.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <fstream>
+
+#include "ProductBroker.h"
+
+namespace {
+
+using namespace producttest;
+
+constexpr const char *kClass = "Talvex_InstalledSoftwareIdentity";
+constexpr const char *kUnserved = "Test_UnservedInstalledSoftware";
+constexpr const char *kRunningId = "Talvex Corlai 5.1.0 build-1483097";
+constexpr const char *kAltId = "Alt Boot Bank: Talvex Corlai 5.1.0 build-654321";
+
+ObjectPath softwarePath(const std::string &instanceId) {
+    return ObjectPath{"", kNs, "Talvex_HypervisorSoftwareIdentity",
+                      {{"InstanceID", CimValue::makeString(instanceId)}}};
+}
+
+const ObjectPath &referenceOf(const ObjectPath &association, const char *role) {
+    const CimValue *value = association.key(role);
+    EXPECT_TRUE(value != nullptr && value->reference) << role;
+    static const ObjectPath none;
+    return value != nullptr && value->reference ? *value->reference : none;
+}
+
+class InstalledSoftware : public ProductBroker {
+protected:
+    InstalledSoftware() : ProductBroker(kClass, kUnserved) {}
+
+    void SetUp() override {
+        bootCfg = testing::TempDir() + "installed_software_" + std::to_string(::getpid()) + ".cfg";
+        std::ofstream(bootCfg) << "build=5.1.0-654321\n";
+        ::setenv("TVX_ALTBOOTBANK_CFG", bootCfg.c_str(), 1);
+        ProductBroker::SetUp();
+        serve(R"({"hostType": "Corlai"})");
+    }
+    void TearDown() override {
+        ProductBroker::TearDown();
+        ::unsetenv("TVX_ALTBOOTBANK_CFG");
+        std::remove(bootCfg.c_str());
+    }
+
+    ObjectPath associationPath(const std::string &instanceId, const char *cls = kClass) const {
+        const ObjectPath system{"", kNs, "OMC_UnitaryComputerSystem",
+                                {{"Name", CimValue::makeString(hostName)},
+                                 {"CreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")}}};
+        return ObjectPath{"", kNs, cls,
+                          {{"System", CimValue::makeReference(system)},
+                           {"InstalledSoftware", CimValue::makeReference(softwarePath(instanceId))}}};
+    }
+
+    std::string bootCfg;
+};
+
+TEST_F(InstalledSoftware, OneNameForTheRunningImageOnly) {
+    const Response names = broker->enumInstanceNames(classPath(kClass));
+    ASSERT_TRUE(names.ok());
+    ASSERT_EQ(names.paths.size(), 1u);
+    EXPECT_TRUE(names.done);
+    const ObjectPath &software = referenceOf(names.paths[0], "InstalledSoftware");
+    EXPECT_EQ(software.key("InstanceID")->text, kRunningId);
+    const ObjectPath &system = referenceOf(names.paths[0], "System");
+    EXPECT_EQ(system.nameSpace, "/root/cimv2");
+    EXPECT_EQ(system.className, "OMC_UnitaryComputerSystem");
+    EXPECT_EQ(system.key("Name")->text, hostName);
+    EXPECT_EQ(system.key("CreationClassName")->text, "OMC_UnitaryComputerSystem");
+
+    const Response instances = broker->enumInstances(classPath(kClass), {});
+    ASSERT_TRUE(instances.ok());
+    ASSERT_EQ(instances.instances.size(), 1u);
+    EXPECT_EQ(referenceOf(instances.instances[0].path, "InstalledSoftware").key("InstanceID")->text, kRunningId);
+
+    const Response other = broker->enumInstanceNames(classPath(kUnserved));
+    EXPECT_TRUE(other.ok() && other.paths.empty() && !other.done);
+}
+
+// The answer depends only on whether the software provider knows the
+// image, so the alternate one is found here; an unknown one passes on the
+// broker's NOT_FOUND.
+TEST_F(InstalledSoftware, GetInstanceAsksTheSoftwareProvider) {
+    const struct {
+        std::string instanceId;
+        const char *cls;
+        CMPIrc rc;
+    } cases[] = {
+        {kRunningId, kClass, CMPI_RC_OK},
+        {kAltId, kClass, CMPI_RC_OK},
+        {"Talvex Corlai 5.1.0 build-1", kClass, CMPI_RC_ERR_NOT_FOUND},
+        {kRunningId, kUnserved, CMPI_RC_ERR_NOT_FOUND},
+    };
+    for (const auto &c : cases) {
+        const Response response = broker->getInstance(associationPath(c.instanceId, c.cls), {});
+        EXPECT_EQ(response.rc, c.rc) << c.instanceId << " " << c.cls;
+        ASSERT_EQ(response.instances.size(), c.rc == CMPI_RC_OK ? 1u : 0u);
+        if (c.rc != CMPI_RC_OK) continue;
+        const ObjectPath &path = response.instances[0].path;
+        EXPECT_EQ(referenceOf(path, "InstalledSoftware").key("InstanceID")->text, c.instanceId);
+        EXPECT_EQ(referenceOf(path, "System").nameSpace, "/root/cimv2");
+    }
+}
+
+// Without a software identity provider the up-call enumeration is empty,
+// and then the association answers nothing at all, not even its end.
+TEST(InstalledSoftwareAlone, NothingAndNoEndWithoutSoftware) {
+    BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
+    std::vector<ProviderRegistration> &registrations = config.registrations;
+    registrations.erase(std::remove_if(registrations.begin(), registrations.end(),
+                                       [](const ProviderRegistration &registration) {
+                                           return registration.className == "Talvex_HypervisorSoftwareIdentity";
+                                       }),
+                        registrations.end());
+    Broker broker(std::move(config));
+    const Response names = broker.enumInstanceNames(ObjectPath{"", kNs, kClass, {}});
+    EXPECT_TRUE(names.ok());
+    EXPECT_TRUE(names.paths.empty());
+    EXPECT_FALSE(names.done);
+    EXPECT_EQ(broker.liveObjectCount(), 0u);
+    broker.shutdown();
+}
+
+}  // namespace
