@@ -25,6 +25,23 @@ std::string instanceIdOf(const CmpiObjectPath &cop) {
     return textOf(key);
 }
 
+// What each operation logs when asked for another class: the requested
+// class and the served one, where the text has room for them.
+constexpr const char *enumNamesOfOtherClass =
+    "Talvex_HypervisorSoftwareIdentityProvider::enumInstanceNames was for %s, not the One True Class, %s.";
+constexpr const char *enumInstancesOfOtherClass =
+    "ERR: Talvex_HypervisorSoftwareIdentityProvider::enumInstances::Throwing not supported error!!!!!";
+constexpr const char *getInstanceOfOtherClass =
+    "Talvex_HypervisorSoftwareIdentityProvider::getInstance was for %s, not the One True Class, %s.";
+
+// Lets a request for the served class through; logs and refuses another.
+void requireServedClass(const CmpiObjectPath &cop, const char *message) {
+    const CmpiString className = cop.getClassName();
+    if (className.equalsIgnoreCase(hypervisorIdentityClass)) return;
+    syslog(LOG_ERR, message, textOf(className), hypervisorIdentityClass);
+    throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
+}
+
 class HypervisorSoftwareIdentity : public CmpiInstanceMI {
 public:
     HypervisorSoftwareIdentity(const CmpiBroker &mb, const CmpiContext &ctx)
@@ -38,17 +55,10 @@ public:
 
     CmpiStatus enumInstanceNames(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop) override {
         const OMC::MutexLock held(lock);
-        const CmpiString className = cop.getClassName();
-        if (!className.equalsIgnoreCase(hypervisorIdentityClass)) {
-            syslog(LOG_ERR,
-                   "Talvex_HypervisorSoftwareIdentityProvider::enumInstanceNames was for %s, not the One True "
-                   "Class, %s.",
-                   textOf(className), hypervisorIdentityClass);
-            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
-        }
+        requireServedClass(cop, enumNamesOfOtherClass);
         versions.gatherVersions();
         for (const SystemVersionInfo *record : records()) {
-            CmpiObjectPath path(cop.getNameSpace(), textOf(className));
+            CmpiObjectPath path(cop.getNameSpace(), textOf(cop.getClassName()));
             path.setKey("InstanceID", CmpiData(makeInstanceId(*record)));
             rslt.returnData(path);
         }
@@ -59,12 +69,7 @@ public:
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
         const OMC::MutexLock held(lock);
-        if (!cop.getClassName().equalsIgnoreCase(hypervisorIdentityClass)) {
-            syslog(LOG_ERR,
-                   "ERR: Talvex_HypervisorSoftwareIdentityProvider::enumInstances::Throwing not supported "
-                   "error!!!!!");
-            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
-        }
+        requireServedClass(cop, enumInstancesOfOtherClass);
         versions.gatherVersions();
         for (const SystemVersionInfo *record : records()) {
             CmpiInstance instance(cop);
@@ -79,14 +84,7 @@ public:
     CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                            const char **properties) override {
         const OMC::MutexLock held(lock);
-        const CmpiString className = cop.getClassName();
-        if (!className.equalsIgnoreCase(hypervisorIdentityClass)) {
-            syslog(LOG_ERR,
-                   "Talvex_HypervisorSoftwareIdentityProvider::getInstance was for %s, not the One True Class, "
-                   "%s.",
-                   textOf(className), hypervisorIdentityClass);
-            throw CmpiStatus(CMPI_RC_ERR_NOT_SUPPORTED);
-        }
+        requireServedClass(cop, getInstanceOfOtherClass);
         versions.gatherVersions();
         CmpiInstance instance(CmpiObjectPath(cop.getNameSpace(), hypervisorIdentityClass));
         instance.setPropertyFilter(properties, nullptr);

@@ -52,14 +52,6 @@ protected:
     }
     void writeBootCfg(const std::string &content) const { std::ofstream(bootCfg) << content; }
 
-    std::vector<std::map<std::string, std::string>> enumerate() const {
-        const Response response = broker->enumInstances(classPath(kClass), {});
-        EXPECT_TRUE(response.ok()) << response.rc;
-        std::vector<std::map<std::string, std::string>> shown;
-        for (const Instance &instance : response.instances) shown.push_back(literals(instance));
-        return shown;
-    }
-
     std::string bootCfg;
 };
 
@@ -132,10 +124,10 @@ TEST_F(SoftwareProvider, PropertiesOfTheRunningAndTheAlternateImage) {
     char utc[32];
     std::strftime(utc, sizeof utc, "\"%Y%m%d%H%M%S.000000+000\"", std::gmtime(&midnight));
 
-    const auto instances = enumerate();
-    ASSERT_EQ(instances.size(), 2u);
-    const auto &running = instances[0];
-    const auto &alternate = instances[1];
+    const Response response = broker->enumInstances(classPath(kClass), {});
+    ASSERT_EQ(response.instances.size(), 2u);
+    const auto running = literals(response.instances[0]);
+    const auto alternate = literals(response.instances[1]);
     EXPECT_EQ(running.at("Name"), "\"Talvex Corlai\"");
     EXPECT_EQ(running.at("ReleaseDate"), utc);
     EXPECT_EQ(running.count("LastStartTime"), 1u);
