@@ -27,7 +27,10 @@ std::string endpointText(const tvxbroker::CimValue *endpoint) {
 }  // namespace
 
 DetectionBroker::DetectionBroker()
-    : embedded(productClasses()), cmpi(embedded.cmpiBroker()), request(embedded.newContext(kNs)) {
+    : embedded(productClasses()),
+      cmpi(embedded.cmpiBroker()),
+      attached(cmpi.prepareAttachThread(CmpiContext(embedded.newContext(kNs)))) {
+    cmpi.attachThread(attached);
     embedded.subscribe([this](const std::string &nameSpace, const tvxbroker::Instance &event) {
         const std::lock_guard<std::mutex> held(mutex);
         if (nameSpace == kNs) delivered.push_back(event);

@@ -1,6 +1,8 @@
 // An embedded broker that knows the product's classes, standing where the
-// host's broker stands for a kernel IP change detector: it keeps what is
-// delivered, and refuses deliveries on request.
+// host's broker stands for a kernel IP change detector. The thread that
+// makes it is attached to it for its lifetime, as the monitor thread
+// attaches itself. It keeps what is delivered, and refuses deliveries on
+// request.
 #pragma once
 
 #include <mutex>
@@ -17,12 +19,16 @@ inline constexpr const char *kNs = "root/cimv2";
 class DetectionBroker {
 public:
     DetectionBroker();
-    ~DetectionBroker() { embedded.shutdown(); }
+    ~DetectionBroker() {
+        cmpi.detachThread(attached);
+        embedded.shutdown();
+    }
     DetectionBroker(const DetectionBroker &) = delete;
     DetectionBroker &operator=(const DetectionBroker &) = delete;
 
     CmpiBroker *broker() { return &cmpi; }
-    const CmpiContext &requestContext() const { return request; }
+    // The attached thread's context.
+    const CmpiContext &context() const { return attached; }
     // The next `count` deliveries are refused (and still recorded).
     void refuseNext(int count) {
         const std::lock_guard<std::mutex> held(mutex);
@@ -38,26 +44,10 @@ public:
 private:
     tvxbroker::Broker embedded;
     CmpiBroker cmpi;
-    CmpiContext request;
+    CmpiContext attached;
     std::mutex mutex;
     std::vector<tvxbroker::Instance> delivered;
     int refusals = 0;
-};
-
-// The calling thread attached to the broker for its lifetime, as the
-// monitor thread attaches itself.
-class AttachedThread {
-public:
-    explicit AttachedThread(DetectionBroker &broker)
-        : cmpi(*broker.broker()), context(cmpi.prepareAttachThread(broker.requestContext())) {
-        cmpi.attachThread(context);
-    }
-    ~AttachedThread() { cmpi.detachThread(context); }
-    AttachedThread(const AttachedThread &) = delete;
-    AttachedThread &operator=(const AttachedThread &) = delete;
-
-    const CmpiBroker &cmpi;
-    const CmpiContext context;
 };
 
 }  // namespace kipdtest

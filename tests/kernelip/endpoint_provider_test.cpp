@@ -48,7 +48,8 @@ protected:
         const auto found = std::find_if(registrations.begin(), registrations.end(), isEndpoint);
         ASSERT_NE(found, registrations.end());
         ProviderRegistration endpoint = *found;
-        registrations.erase(std::remove_if(registrations.begin(), registrations.end(), isEndpoint), registrations.end());
+        registrations.erase(std::remove_if(registrations.begin(), registrations.end(), isEndpoint),
+                            registrations.end());
         for (const std::string &className : classNames) {
             endpoint.className = className;
             registrations.push_back(endpoint);
