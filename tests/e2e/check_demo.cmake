@@ -2,8 +2,9 @@
 # one file (`tvxcim demo > log 2>&1`), and checks that each line the instance
 # factories write to standard error stands on its own line, and that what
 # the demo shows is the default host's ports, identities and associations,
-# its kernel IP endpoints, its two processor packages, and at the end this
-# host's first heartbeat.
+# its kernel IP endpoints, its two processor packages, the computer system
+# the stand-in host providers serve under this host's name, and at the end
+# this host's first heartbeat.
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
 set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
 execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
@@ -35,6 +36,7 @@ set(expected
   "instance of Talvex_KernelIPv6ProtocolEndpoint\n[^}]*Name = \"vmk1\";[^}]*IPv6Address = \"2001:db8:10::21\";\n    PrefixLength = 48;"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-0\";[^}]*Vendor = 2;"
   "instance of Talvex_Processor\n[^}]*DeviceID = \"cpu-1\";[^}]*Vendor = 3;"
+  "instance of OMC_UnitaryComputerSystem\n[^}]*\n    Name = \"${host}\";[^}]*ElementName = \"${host}\";"
   "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
   "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"")
 foreach(pattern IN LISTS expected)
