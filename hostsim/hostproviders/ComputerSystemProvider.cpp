@@ -56,25 +56,17 @@ CmpiInstance systemInstance(const CmpiString &ns, const std::string &name, const
 
 }  // namespace
 
-CmpiStatus ComputerSystemProvider::enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
-                                                     const CmpiObjectPath &cop) {
+CmpiStatus enumComputerSystems(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
+                               const char **properties, CmpiBroker *broker) {
     if (!servedClass(cop)) return CmpiStatus(CMPI_RC_OK);
-    rslt.returnData(systemPath(cop.getNameSpace(), OMC::getComputerSystemName(ctx, getBroker())));
+    rslt.returnData(systemInstance(cop.getNameSpace(), OMC::getComputerSystemName(ctx, broker), properties));
     rslt.returnDone();
     return CmpiStatus(CMPI_RC_OK);
 }
 
-CmpiStatus ComputerSystemProvider::enumInstances(const CmpiContext &ctx, CmpiResult &rslt,
-                                                 const CmpiObjectPath &cop, const char **properties) {
-    if (!servedClass(cop)) return CmpiStatus(CMPI_RC_OK);
-    rslt.returnData(systemInstance(cop.getNameSpace(), OMC::getComputerSystemName(ctx, getBroker()), properties));
-    rslt.returnDone();
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus ComputerSystemProvider::getInstance(const CmpiContext &ctx, CmpiResult &rslt,
-                                               const CmpiObjectPath &cop, const char **properties) {
-    const std::string name = OMC::getComputerSystemName(ctx, getBroker());
+CmpiStatus getComputerSystem(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
+                             const char **properties, CmpiBroker *broker) {
+    const std::string name = OMC::getComputerSystemName(ctx, broker);
     if (!servedClass(cop) || !namesSystem(cop, name)) return CmpiStatus(CMPI_RC_ERR_NOT_FOUND);
     rslt.returnData(systemInstance(cop.getNameSpace(), name, properties));
     rslt.returnDone();

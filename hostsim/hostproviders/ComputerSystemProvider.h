@@ -3,24 +3,18 @@
 // resolves to it.
 #pragma once
 
-#include "CmpiInstanceMI.h"
+#include "frame/ForwardingInstanceProvider.h"
 
 namespace HostProviders {
 
-class ComputerSystemProvider : public CmpiInstanceMI {
-public:
-    ComputerSystemProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx) {}
-    ~ComputerSystemProvider() override = default;
+CmpiStatus enumComputerSystems(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
+                               const char **properties, CmpiBroker *broker);
 
-    CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
-                                 const CmpiObjectPath &cop) override;
-    CmpiStatus enumInstances(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
-                             const char **properties) override;
-    // Any path but the system's is CMPI_RC_ERR_NOT_FOUND: sfcb's provider
-    // process dies of an up-call answered OK without an instance.
-    CmpiStatus getInstance(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
-                           const char **properties) override;
-};
+// Any path but the system's is CMPI_RC_ERR_NOT_FOUND: sfcb's provider
+// process dies of an up-call answered OK without an instance.
+CmpiStatus getComputerSystem(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
+                             const char **properties, CmpiBroker *broker);
+
+using ComputerSystemProvider = frame::ForwardingInstanceProvider<enumComputerSystems, getComputerSystem>;
 
 }  // namespace HostProviders
