@@ -31,7 +31,9 @@ void measure(benchmark::State &state, const char *profileFile, Request &&request
         state.SkipWithError(error);
         return;
     }
-    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PRODUCT_REGISTRATION, {TVX_PRODUCT_MOFS}));
+    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR, TVX_HOST_PROVIDER_DIR},
+                                   {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
+                                   {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF}));
     std::size_t instances = 0;
     for (auto _ : state) {
         const Response response = request(broker);

@@ -64,6 +64,26 @@ function(tvx_product_mofs out)
   set(${out} ${PROJECT_SOURCE_DIR}/mof/cim_base.mof ${talvex_mofs} PARENT_SCOPE)
 endfunction()
 
+# tvx_host_broker_definitions(<target> <PRIVATE|INTERFACE>)
+# What a broker on a host loads, as C string literals for <target>: the
+# product (TVX_PROVIDER_DIR, TVX_PROVIDER_REG, TVX_PRODUCT_MOFS: its
+# folder, registration and MOF files in reading order) and the stand-in
+# host providers (TVX_HOST_PROVIDER_DIR, TVX_HOST_PROVIDER_REG,
+# TVX_HOST_PROVIDER_MOF). Both libraries are built first.
+function(tvx_host_broker_definitions target scope)
+  tvx_product_mofs(product_mofs)
+  tvx_c_strings(product_mofs ${product_mofs})
+  set(host_providers ${PROJECT_SOURCE_DIR}/hostsim/hostproviders)
+  target_compile_definitions(${target} ${scope}
+    "TVX_PROVIDER_DIR=\"$<TARGET_FILE_DIR:tvxprovider>\""
+    "TVX_PROVIDER_REG=\"${PROJECT_SOURCE_DIR}/mof/tvxprovider.reg\""
+    "TVX_PRODUCT_MOFS=${product_mofs}"
+    "TVX_HOST_PROVIDER_DIR=\"$<TARGET_FILE_DIR:tvxhostproviders>\""
+    "TVX_HOST_PROVIDER_REG=\"${host_providers}/hostproviders.reg\""
+    "TVX_HOST_PROVIDER_MOF=\"${host_providers}/hostproviders.mof\"")
+  add_dependencies(${target} tvxprovider tvxhostproviders)
+endfunction()
+
 # Sets <out> to the items as C string literals separated by commas: the
 # inside of an initializer list.
 function(tvx_c_strings out)

@@ -144,20 +144,41 @@ const std::vector<ProviderRegistration> &Broker::registrations() const {
 
 std::size_t Broker::liveObjectCount() const { return ObjectPool::liveCount(); }
 
-BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
-                              const std::string &registrationFile,
-                              const std::vector<std::string> &mofFiles) {
-    BrokerConfig config;
-    config.providerDirs = providerDirs;
-    config.registrations = readRegistrationFile(registrationFile);
-    for (const std::string &mof : mofFiles) config.schema.loadFile(mof);
-    for (const ProviderRegistration &registration : config.registrations) {
+namespace {
+
+// Each class is served by one registration, and declared by some MOF file.
+void addRegistrations(BrokerConfig &config, const std::string &registrationFile) {
+    const std::size_t earlier = config.registrations.size();
+    for (ProviderRegistration &registration : readRegistrationFile(registrationFile)) {
+        for (std::size_t i = 0; i < earlier; ++i) {
+            if (equalsIgnoreCase(config.registrations[i].className, registration.className)) {
+                throw std::runtime_error(registrationFile + ": class " + registration.className +
+                                         " is registered by an earlier registration file too");
+            }
+        }
         if (config.schema.find(registration.className) == nullptr) {
             throw std::runtime_error(registrationFile + ": class " + registration.className +
                                      " is registered but declared in no MOF file");
         }
+        config.registrations.push_back(std::move(registration));
     }
+}
+
+}  // namespace
+
+BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
+                              const std::vector<std::string> &registrationFiles,
+                              const std::vector<std::string> &mofFiles) {
+    BrokerConfig config;
+    config.providerDirs = providerDirs;
+    for (const std::string &mof : mofFiles) config.schema.loadFile(mof);
+    for (const std::string &registrationFile : registrationFiles) addRegistrations(config, registrationFile);
     return config;
+}
+
+BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs, const char *registrationFile,
+                              const std::vector<std::string> &mofFiles) {
+    return loadBrokerConfig(providerDirs, std::vector<std::string>{registrationFile}, mofFiles);
 }
 
 }  // namespace tvxbroker

@@ -126,10 +126,16 @@ private:
     std::unique_ptr<State> state;
 };
 
-// Reads the registration file and every MOF file; throws std::runtime_error
-// with a clear message when one cannot be read or parsed.
+// Reads every registration file, as sfcb serves what several staged
+// registrations name together, and every MOF file; throws
+// std::runtime_error with a clear message when one cannot be read or
+// parsed, or when two files register the same class.
 BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
-                              const std::string &registrationFile,
+                              const std::vector<std::string> &registrationFiles,
+                              const std::vector<std::string> &mofFiles);
+
+// The same for a single registration file.
+BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs, const char *registrationFile,
                               const std::vector<std::string> &mofFiles);
 
 }  // namespace tvxbroker

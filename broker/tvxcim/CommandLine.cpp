@@ -18,7 +18,7 @@ const char *const usageText =
     "  listen       every indication as it arrives, until --seconds or Ctrl-C\n"
     "options:\n"
     "  --provider-dir DIR    where provider libraries are found (repeatable)\n"
-    "  --registration FILE   sfcb provider registration\n"
+    "  --registration FILE   sfcb provider registration (repeatable)\n"
     "  --mof FILE            class declarations (repeatable)\n"
     "  --properties A,B      property list (ei, gi, ai, ri); empty text: none\n"
     "  --assoc-class C  --result-class C  --role R  --result-role R\n"
@@ -26,6 +26,9 @@ const char *const usageText =
     "                        (10 by default); listen: stop after N seconds\n"
     "  --json                JSON instead of MOF, one object per line (see below)\n"
     "  --help                this text\n"
+    "  Without --provider-dir, --registration and --mof: this build's product\n"
+    "  (libtvxprovider.so) and stand-in host providers (libtvxhostproviders.so),\n"
+    "  each with its MOF and registration, on the simulated host.\n"
     "JSON: an instance is {\"className\", \"path\", \"properties\"}, a path\n"
     "  {\"text\", \"namespace\", \"className\", \"keys\"}, where \"text\" is the PATH\n"
     "  form above; properties and keys map each name to {\"type\", \"value\"}, the\n"
@@ -79,7 +82,7 @@ CommandLine parseCommandLine(const std::vector<std::string> &args) {
         const std::string &option = args[i];
         if (option.rfind("--", 0) != 0) words.push_back(option);
         else if (option == "--provider-dir") line.providerDirs.push_back(value(option));
-        else if (option == "--registration") line.registration = value(option);
+        else if (option == "--registration") line.registrations.push_back(value(option));
         else if (option == "--mof") line.mofFiles.push_back(value(option));
         else if (option == "--properties") line.properties = splitList(value(option));
         else if (option == "--assoc-class") line.assocClass = value(option);
@@ -100,7 +103,7 @@ CommandLine parseCommandLine(const std::vector<std::string> &args) {
         line.argument = words[1];
     }
     if (words.size() > wordsTaken) throw UsageError("unexpected argument " + words[wordsTaken]);
-    if (line.registration.empty()) throw UsageError("no provider registration: use --registration");
+    if (line.registrations.empty()) throw UsageError("no provider registration: use --registration");
     if (line.mofFiles.empty()) throw UsageError("no class declarations: use --mof");
     if (line.providerDirs.empty()) throw UsageError("no provider directory: use --provider-dir");
     return line;

@@ -16,7 +16,7 @@ inline constexpr const char *defaultNameSpace = "root/cimv2";
 
 struct CommandLine {
     std::vector<std::string> providerDirs;
-    std::string registration;
+    std::vector<std::string> registrations;
     std::vector<std::string> mofFiles;
     tvxbroker::PropertyList properties;
     std::string assocClass;

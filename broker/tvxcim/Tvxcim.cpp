@@ -46,7 +46,7 @@ private:
 
 void serve(const CommandLine &line, std::ostream &out, BrokerReports &reports) {
     tvxbroker::BrokerConfig config =
-        tvxbroker::loadBrokerConfig(line.providerDirs, line.registration, line.mofFiles);
+        tvxbroker::loadBrokerConfig(line.providerDirs, line.registrations, line.mofFiles);
     config.diagnostics = reports.sink();
     tvxbroker::Broker broker(std::move(config));
     const std::unique_ptr<ResultWriter> writer = line.json ? makeJsonWriter(out) : makeMofWriter(out);

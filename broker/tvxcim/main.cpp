@@ -1,11 +1,11 @@
-// tvxcim: a CIM client that runs the embedded broker in-process on a
-// provider registration and answers one request. Without any of the
-// library options it serves the product library of this build, on the host
-// the stand-in platform libraries simulate.
+// tvxcim: a CIM client that runs the embedded broker in-process on
+// provider registrations and answers one request. Without any of the
+// library options it serves what a broker on the host would: the product
+// library of this build and the stand-in host providers, on the host the
+// stand-in platform libraries simulate.
 #include <algorithm>
 #include <cstdlib>
 #include <iostream>
-#include <sstream>
 #include <stdexcept>
 
 #include "hostsim/HostSimControl.h"
@@ -19,11 +19,12 @@ bool namesItsLibrary(const std::vector<std::string> &args) {
     });
 }
 
-std::vector<std::string> withProductLibrary(std::vector<std::string> args) {
-    std::vector<std::string> options = {"--provider-dir", TVX_PRODUCT_PROVIDER_DIR,
-                                        "--registration", TVX_PRODUCT_REGISTRATION};
-    std::stringstream mofs(TVX_PRODUCT_MOFS);
-    for (std::string mof; std::getline(mofs, mof, ':');) {
+std::vector<std::string> withHostLibraries(std::vector<std::string> args) {
+    std::vector<std::string> options = {
+        "--provider-dir", TVX_PROVIDER_DIR, "--provider-dir", TVX_HOST_PROVIDER_DIR,
+        "--registration", TVX_PROVIDER_REG, "--registration", TVX_HOST_PROVIDER_REG,
+    };
+    for (const char *mof : {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF}) {
         options.push_back("--mof");
         options.push_back(mof);
     }
@@ -45,7 +46,7 @@ void checkHostProfile(const tvxcim::CommandLine &) {
 
 int main(int argc, char **argv) {
     std::vector<std::string> args(argv + 1, argv + argc);
-    if (!namesItsLibrary(args)) args = withProductLibrary(std::move(args));
+    if (!namesItsLibrary(args)) args = withHostLibraries(std::move(args));
     std::vector<tvxcim::PreflightCheck> checks = tvxcim::standardPreflightChecks();
     checks.push_back(checkHostProfile);
     return tvxcim::runTvxcim(args, std::cout, std::cerr, checks);

@@ -1,4 +1,4 @@
-// Every class the registration serves, compared through the embedded broker
+// Every class the registrations serve, compared through the embedded broker
 // as a client of sfcb would: instance names against the paths and keys of
 // the instances, each name's instance against the enumerated one, every
 // property's type against its class, and for every association the names
@@ -24,8 +24,8 @@ using testing::UnorderedElementsAreArray;
 using tvxcim::describeFailure;
 
 // What the suite runs on, fixed when it is built (tvx_add_consistency_suite).
-const char *const kProviderDir = TVX_SUITE_PROVIDER_DIR;
-const char *const kRegistration = TVX_SUITE_REGISTRATION;
+const std::vector<std::string> kProviderDirs = {TVX_SUITE_PROVIDER_DIRS};
+const std::vector<std::string> kRegistrations = {TVX_SUITE_REGISTRATIONS};
 const std::vector<std::string> kMofFiles = {TVX_SUITE_MOFS};
 
 enum class Deviation {
@@ -64,17 +64,19 @@ const ExpectedException *expected(const std::string &className, Deviation deviat
     return nullptr;
 }
 
-BrokerConfig suiteConfig() { return loadBrokerConfig({kProviderDir}, kRegistration, kMofFiles); }
+BrokerConfig suiteConfig() { return loadBrokerConfig(kProviderDirs, kRegistrations, kMofFiles); }
 
 // Read while the tests are being listed; a registration that cannot be read
-// gives no classes, and RegistrationServesInstances says why.
+// gives no classes, and RegistrationsServeInstances says why.
 std::vector<std::string> servedClasses(bool ProviderRegistration::*kind) {
     std::vector<std::string> classes;
     std::set<std::string> seen;
     try {
-        for (const ProviderRegistration &registration : readRegistrationFile(kRegistration)) {
-            if (registration.*kind && seen.insert(toLowerAscii(registration.className)).second) {
-                classes.push_back(registration.className);
+        for (const std::string &file : kRegistrations) {
+            for (const ProviderRegistration &registration : readRegistrationFile(file)) {
+                if (registration.*kind && seen.insert(toLowerAscii(registration.className)).second) {
+                    classes.push_back(registration.className);
+                }
             }
         }
     } catch (const std::exception &) {
@@ -83,9 +85,9 @@ std::vector<std::string> servedClasses(bool ProviderRegistration::*kind) {
     return classes;
 }
 
-TEST(ConsistencySuite, RegistrationServesInstances) {
+TEST(ConsistencySuite, RegistrationsServeInstances) {
     ASSERT_NO_THROW(suiteConfig());
-    EXPECT_FALSE(servedClasses(&ProviderRegistration::instance).empty()) << kRegistration;
+    EXPECT_FALSE(servedClasses(&ProviderRegistration::instance).empty()) << kRegistrations.front();
 }
 
 class ServedClass : public testing::TestWithParam<std::string> {

@@ -20,7 +20,8 @@ constexpr const char *kQuery = "SELECT * FROM Talvex_CIMHeartbeat";
 
 TEST(HeartbeatProduct, BeatsOnceLoadedAndAcceptsWhatSfcbAsksUntilShutdown) {
     EventSink sink;
-    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, {TVX_PRODUCT_MOFS}));
+    Broker broker(loadBrokerConfig({TVX_PROVIDER_DIR, TVX_HOST_PROVIDER_DIR}, {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
+                                  {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF}));
     broker.subscribe(sink.subscriber(true));
 
     const std::function<Response()> operations[] = {

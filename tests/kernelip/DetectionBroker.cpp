@@ -1,8 +1,6 @@
 #include "DetectionBroker.h"
 
-#include "core/EncObjects.h"
-#include "model/CimTypes.h"
-#include "model/ValueText.h"
+#include <utility>
 
 namespace kipdtest {
 namespace {
@@ -29,43 +27,25 @@ std::string endpointText(const tvxbroker::CimValue *endpoint) {
 }  // namespace
 
 DetectionBroker::DetectionBroker()
-    : embedded(productClasses()), cmpi(embedded.cmpiBroker()), requestContext(embedded.newContext(kNs)) {
-    embedded.subscribe(sink.subscriber(true));
-    embedded.subscribe([this](const std::string &, const tvxbroker::Instance &) {
-        if (refusals.load() <= 0) return true;
-        --refusals;
-        return false;
+    : embedded(productClasses()),
+      cmpi(embedded.cmpiBroker()),
+      attached(cmpi.prepareAttachThread(CmpiContext(embedded.newContext(kNs)))) {
+    cmpi.attachThread(attached);
+    embedded.subscribe([this](const std::string &nameSpace, const tvxbroker::Instance &event) {
+        const std::lock_guard<std::mutex> held(mutex);
+        if (nameSpace == kNs) delivered.push_back(event);
+        return refusals-- <= 0;
     });
 }
 
-std::vector<brokertest::Delivery> DetectionBroker::takeDelivered() {
-    std::vector<brokertest::Delivery> all = sink.received();
-    std::vector<brokertest::Delivery> fresh(all.begin() + static_cast<std::ptrdiff_t>(taken), all.end());
-    taken = all.size();
-    return fresh;
+std::vector<tvxbroker::Instance> DetectionBroker::takeDelivered() {
+    const std::lock_guard<std::mutex> held(mutex);
+    return std::exchange(delivered, {});
 }
 
-const tvxbroker::Instance &brokerSide(const CmpiInstance &instance) {
-    return tvxbroker::enc::instanceOf(instance.getEnc())->value;
-}
-
-std::vector<std::string> propertyLines(const tvxbroker::Instance &instance) {
+std::vector<std::string> DetectionBroker::takeSummaries() {
     std::vector<std::string> lines;
-    for (const tvxbroker::NamedValue &property : instance.properties) {
-        const std::string type = property.value.type == CMPI_instance ? "instance"
-                                                                      : tvxbroker::cimTypeName(property.value.type);
-        std::string text = "NULL";
-        bool quoted = false;
-        if (!property.value.null) tvxbroker::scalarText(property.value, text, quoted);
-        lines.push_back(property.name + " " + type + " " + text);
-    }
-    return lines;
-}
-
-std::vector<std::string> summaries(const std::vector<brokertest::Delivery> &deliveries) {
-    std::vector<std::string> lines;
-    for (const brokertest::Delivery &delivery : deliveries) {
-        const tvxbroker::Instance &event = delivery.event;
+    for (const tvxbroker::Instance &event : takeDelivered()) {
         lines.push_back(textOf(event.property("IndicationIdentifier")) + " " +
                         endpointText(event.property("PreviousInstance")) + " -> " +
                         endpointText(event.property("SourceInstance")));

@@ -8,31 +8,21 @@
 
 namespace kipdtest {
 
-Entry ipv4(const std::string &name, const std::string &address, const std::string &netmask) {
-    return {name, AF_INET, address, netmask};
-}
-
-Entry ipv6(const std::string &name, const std::string &address, const std::string &netmask) {
-    return {name, AF_INET6, address, netmask};
-}
-
 InterfaceAddressList::InterfaceAddressList(const EntryList &entries) {
     // The nodes link to each other, so they never move once built.
     nodes.reserve(entries.size());
     for (const Entry &entry : entries) {
-        ifaddrs node{};
+        ifaddrs &node = nodes.emplace_back();
         node.ifa_name = names.emplace_back(entry.name).data();
         node.ifa_addr = socketAddress(entry.family, entry.address);
         node.ifa_netmask = socketAddress(entry.family, entry.netmask);
-        nodes.push_back(node);
+        if (nodes.size() > 1) nodes[nodes.size() - 2].ifa_next = &node;
     }
-    for (std::size_t i = 1; i < nodes.size(); ++i) nodes[i - 1].ifa_next = &nodes[i];
 }
 
 sockaddr *InterfaceAddressList::socketAddress(int family, const std::string &text) {
     if (text.empty()) return nullptr;
     sockaddr_storage &storage = socketAddresses.emplace_back();
-    storage = {};
     storage.ss_family = static_cast<sa_family_t>(family);
     void *bytes = nullptr;
     if (family == AF_INET) bytes = &reinterpret_cast<sockaddr_in &>(storage).sin_addr;
@@ -69,7 +59,5 @@ int ScriptedInterfaceAddresses::read(ifaddrs **list) {
     if (*list != nullptr) ++handedOut;
     return 0;
 }
-
-void ScriptedInterfaceAddresses::release(ifaddrs *) { --handedOut; }
 
 }  // namespace kipdtest

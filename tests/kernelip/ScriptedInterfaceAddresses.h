@@ -1,12 +1,10 @@
 // Interface-address lists in getifaddrs's own shape, written as text, and a
-// source that hands them to a change detector in place of the system's,
-// counting what it reads and frees.
+// source that hands them to a change detector in place of the system's.
 #pragma once
 
 #include <ifaddrs.h>
 #include <sys/socket.h>
 
-#include <cstddef>
 #include <deque>
 #include <memory>
 #include <string>
@@ -16,9 +14,9 @@
 
 namespace kipdtest {
 
-// One entry. AF_INET and AF_INET6 addresses and netmasks are texts that
-// inet_pton reads; an empty text leaves that pointer null. Any other family
-// gets a bare socket address of that family (a link-layer entry, say).
+// Addresses and netmasks are texts inet_pton reads for AF_INET and
+// AF_INET6; an empty text leaves that pointer null. Any other family gets a
+// bare socket address of that family (a link-layer entry, say).
 struct Entry {
     std::string name;
     int family;
@@ -28,10 +26,15 @@ struct Entry {
 
 using EntryList = std::vector<Entry>;
 
-Entry ipv4(const std::string &name, const std::string &address, const std::string &netmask = "255.255.255.0");
-Entry ipv6(const std::string &name, const std::string &address, const std::string &netmask = "ffff:ffff:ffff:ffff::");
+inline Entry ipv4(const std::string &name, const std::string &address, const std::string &netmask = "255.255.255.0") {
+    return {name, AF_INET, address, netmask};
+}
+inline Entry ipv6(const std::string &name, const std::string &address,
+                  const std::string &netmask = "ffff:ffff:ffff:ffff::") {
+    return {name, AF_INET6, address, netmask};
+}
 
-// A built list: linked nodes, their socket addresses and names, owned here.
+// A built list, owning its linked nodes, socket addresses and names.
 class InterfaceAddressList {
 public:
     explicit InterfaceAddressList(const EntryList &entries);
@@ -53,12 +56,11 @@ public:
     // From now on reads give these lists in turn, round and round.
     void show(const std::vector<EntryList> &lists);
     void show(const EntryList &list) { show(std::vector<EntryList>{list}); }
-    // `count` reads fail with `error` and give no list, once `after` more
-    // reads have succeeded.
+    // `count` reads fail with `error`, once `after` more reads have succeeded.
     void failReads(int error, int count, int after = 0);
 
     int read(ifaddrs **list) override;
-    void release(ifaddrs *list) override;
+    void release(ifaddrs *) override { --handedOut; }
 
     int readCount() const { return reads; }
     // Lists handed out and not yet released.

@@ -17,19 +17,13 @@ using TVX::IAddress;
 using TVX::IPv4Address;
 using TVX::IPv6Address;
 
-// One address object made from a one-entry list, which it outlives.
-template <class Address>
-std::unique_ptr<IAddress> made(const Entry &entry) {
-    InterfaceAddressList list({entry});
-    return std::make_unique<Address>(list.head());
-}
-
+// Address objects made from one-entry lists, which they outlive.
 std::unique_ptr<IAddress> v4(const char *address, const char *netmask = "255.255.255.0") {
-    return made<IPv4Address>(ipv4("vmk0", address, netmask));
+    return std::make_unique<IPv4Address>(InterfaceAddressList({ipv4("vmk0", address, netmask)}).head());
 }
 
 std::unique_ptr<IAddress> v6(const char *address, const char *netmask = "ffff:ffff:ffff:ffff::") {
-    return made<IPv6Address>(ipv6("vmk0", address, netmask));
+    return std::make_unique<IPv6Address>(InterfaceAddressList({ipv6("vmk0", address, netmask)}).head());
 }
 
 TEST(AddressModel, PrefixIsTheRunOfLeadingOnesOrZeroWhenTheMaskIsNotContiguous) {
@@ -42,11 +36,8 @@ TEST(AddressModel, PrefixIsTheRunOfLeadingOnesOrZeroWhenTheMaskIsNotContiguous) 
         {"ffff:fe00::", 16, 23},
         {"::", 16, 0},
         {"ff00:ff00::", 16, 0},
-        {"ff81::", 16, 0},
+        {"ff81::", 16, 0},                 // a one after a zero in the partial byte
         {"ffff:ffff:ffff:ffff:ffff:ffff:ffff:ffff", 16, 128},
-        {"8000::", 16, 1},
-        {"fffe::", 16, 15},
-        {"ff01::", 16, 0},                 // a one in the lowest bit after a zero
         {"fffe:8000::", 16, 0},            // a one in the byte after the partial one
         {"ffff:ffff:ffff:ffff::1", 16, 0},  // a one in the last byte
         {"ffff:0001::", 2, 16},            // bytes beyond the length are not read

@@ -1,9 +1,12 @@
 // The endpoint walk against the stand-in host: per interface its IPv4
 // record, then its IPv6 records; every fault giving its result with the
 // records read before it, the status word deciding the result of a walk
-// that reaches its end, and every list freed on every path.
+// that reaches its end, and every list freed on every path; and the
+// node-244 record as the kernel may hand it over.
 #include <arpa/inet.h>
 
+#include <algorithm>
+#include <cstring>
 #include <string>
 #include <vector>
 
@@ -11,6 +14,7 @@
 
 #include "hostsim/HostSimControl.h"
 #include "kernelip/GetEndpointDetails.h"
+#include "kernelip/IPv6Record.h"
 
 namespace TVX {
 namespace {
@@ -28,43 +32,6 @@ std::string describe(const endpointDetails &record) {
     return std::string(record.name) + " " + address + "/" + netmask;
 }
 
-struct Walk {
-    unsigned int result;
-    std::vector<std::string> records;
-};
-
-class EndpointInventory : public testing::Test {
-protected:
-    void SetUp() override { foreignBefore_ = HostSim_ForeignDestroyCount(); }
-    void TearDown() override {
-        EXPECT_EQ(HostSim_LiveListCount(), 0u) << "a list was not freed";
-        EXPECT_EQ(HostSim_ForeignDestroyCount(), foreignBefore_) << "something not a live list was destroyed";
-        HostSim_ResetProfile();
-    }
-
-    // Walks the host; an empty profile text walks the built-in one.
-    static Walk walk(const std::string &profile) {
-        char error[256] = "";
-        if (profile.empty()) {
-            HostSim_ResetProfile();
-        } else {
-            EXPECT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
-        }
-        std::vector<endpointDetails> endpoints;
-        Walk taken{getendpointDetails(endpoints), {}};
-        for (const endpointDetails &record : endpoints) taken.records.push_back(describe(record));
-        EXPECT_EQ(HostSim_LiveListCount(), 0u) << profile;
-        return taken;
-    }
-
-private:
-    std::size_t foreignBefore_ = 0;
-};
-
-std::string host(const std::string &interfaces, const std::string &faults) {
-    return R"({"hostType": "Corlai", "ipInterfaces": [)" + interfaces + R"(], "faults": [)" + faults + "]}";
-}
-
 const std::string threeInterfaces = R"(
     {"name": "vmk0", "ipv4Address": "192.168.10.21", "ipv4Netmask": "255.255.255.0",
      "ipv6": [{"instance": "a", "address": "fe80::1"},
@@ -76,8 +43,13 @@ const std::string threeInterfaces = R"(
 const std::string v4vmk0 = "vmk0 192.168.10.21/255.255.255.0", a = "vmk0 fe80::1/64", b = "vmk0 2001:db8::1/48",
                   c = "vmk1 2001:db8:1::5/64", v4vmk2 = "vmk2 10.0.0.2/255.0.0.0", d = "vmk2 fd00::2/56",
                   e = "vmk2 fd00::3/57";
+// Names are cut at 150 characters.
+const std::string exact(150, 'x'), longer(153, 'y'), cut = longer.substr(0, 150);
+const std::string longNames = R"({"name": ")" + exact + R"(", "ipv4Address": "10.0.0.1"}, {"name": ")" + longer +
+                              R"(", "ipv4Address": "10.0.0.2", "ipv6": [{"address": "::1"}]})";
 
-TEST_F(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
+TEST(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
+    const std::size_t foreignBefore = HostSim_ForeignDestroyCount();
     const struct {
         const char *faults;
         unsigned int result;
@@ -90,7 +62,6 @@ TEST_F(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
         // vmk1 has no address, so its netmask is never asked for.
         {R"({"call": "PRB_Get", "node": 240, "instance": "vmk1"})", 0, {v4vmk0, a, b, c, v4vmk2, d, e}},
         {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk0"})", 0, {v4vmk0, c, v4vmk2, d, e}},
-        {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk2"})", 0, {v4vmk0, a, b, c, v4vmk2}},
         {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk1", "noList": true})", 0,
          {v4vmk0, a, b, v4vmk2, d, e}},
         {R"({"call": "PRB_Get", "node": 244, "instance": "b"})", 1, {v4vmk0, a}},
@@ -111,31 +82,52 @@ TEST_F(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
         {R"({"call": "PRB_ParamListCreate"})", 1, {}},
         {"", 0, {}, ""},
         {R"({"call": "PRB_ParamListCreate"})", 1, {}, ""},
+        {"", 0, {exact + " 10.0.0.1/0.0.0.0", cut + " 10.0.0.2/0.0.0.0", cut + " ::1/64"}, longNames},
     };
     for (const auto &row : cases) {
-        const Walk taken = walk(host(row.interfaces, row.faults));
-        EXPECT_EQ(taken.result, row.result) << row.faults << (row.interfaces.empty() ? " (no interfaces)" : "");
-        EXPECT_EQ(taken.records, row.records) << row.faults;
+        SCOPED_TRACE(std::string(row.faults) + (row.interfaces.empty() ? " (no interfaces)" : ""));
+        const std::string profile =
+            R"({"hostType": "Corlai", "ipInterfaces": [)" + row.interfaces + R"(], "faults": [)" + row.faults + "]}";
+        char error[256] = "";
+        ASSERT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
+        std::vector<endpointDetails> endpoints;
+        EXPECT_EQ(getendpointDetails(endpoints), row.result);
+        std::vector<std::string> records;
+        for (const endpointDetails &record : endpoints) records.push_back(describe(record));
+        EXPECT_EQ(records, row.records);
+        EXPECT_EQ(HostSim_LiveListCount(), 0u) << "a list was not freed";
     }
+    EXPECT_EQ(HostSim_ForeignDestroyCount(), foreignBefore) << "something not a live list was destroyed";
+    HostSim_ResetProfile();
 }
 
-TEST_F(EndpointInventory, NamesAreCutAt150Characters) {
-    const std::string exact(150, 'x'), longer(153, 'y'), cut = longer.substr(0, 150);
-    const Walk taken = walk(host(R"({"name": ")" + exact + R"(", "ipv4Address": "10.0.0.1"}, {"name": ")" + longer +
-                                     R"(", "ipv4Address": "10.0.0.2", "ipv6": [{"address": "::1"}]})",
-                                 ""));
-    EXPECT_EQ(taken.result, 0u);
-    EXPECT_EQ(taken.records, (std::vector<std::string>{exact + " 10.0.0.1/0.0.0.0", cut + " 10.0.0.2/0.0.0.0",
-                                                       cut + " ::1/64"}));
-}
-
-TEST_F(EndpointInventory, BuiltInHost) {
-    const Walk taken = walk("");
-    EXPECT_EQ(taken.result, 0u);
-    EXPECT_EQ(taken.records, (std::vector<std::string>{
-                                 "vmk0 192.168.10.21/255.255.255.0", "vmk1 10.20.30.40/255.255.0.0",
-                                 "vmk1 fe80::250:56ff:fe6a:1b2c/64", "vmk1 2001:db8:10::21/48",
-                                 "vmk2 2001:db8:20::5/64", "vmk3 0.0.0.0/0.0.0.0"}));
+// A text that fills its field with no terminator, a prefix length beyond a
+// byte, and bytes past the prefix that must not be read.
+TEST(IPv6Record, AddressTextAndLittleEndianPrefix) {
+    const struct {
+        std::string text;
+        unsigned char prefix[4];
+        const char *address;
+        uint32_t prefixLength;
+    } cases[] = {
+        {"fe80::250:56ff:fe6a:1b2c", {64, 0, 0, 0}, "fe80::250:56ff:fe6a:1b2c", 64},
+        {"2001:db8::1", {0x78, 0x56, 0x34, 0x12}, "2001:db8::1", 0x12345678},
+        // Printable prefix bytes, so a text read past its field would show them.
+        {std::string(48, 'f'), {'7', '8', 0, 0}, "ffffffffffffffffffffffffffffffffffffffffffffffff", 0x3837},
+        {"", {0xff, 0xff, 0xff, 0xff}, "", 0xffffffff},
+    };
+    for (const auto &row : cases) {
+        unsigned char record[ipv6RecordSize];
+        std::memset(record, 'x', sizeof record);
+        std::memset(record, 0, 48);
+        std::memcpy(record, row.text.data(), std::min<std::size_t>(row.text.size(), 48));
+        std::memcpy(record + 48, row.prefix, sizeof row.prefix);
+        endpointDetails endpoint;
+        std::memset(&endpoint, 0x5a, sizeof endpoint);
+        decodeIPv6Record(record, endpoint);
+        EXPECT_STREQ(endpoint.ipv6Address, row.address) << row.text;
+        EXPECT_EQ(endpoint.ipv6PrefixLength, row.prefixLength) << row.text;
+    }
 }
 
 }  // namespace

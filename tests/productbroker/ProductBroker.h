@@ -1,5 +1,5 @@
-// The product library in the embedded broker, serving a host profile given
-// as text, with the answers reduced to what a client compares. One provider
+// The product library in the embedded broker beside the stand-in host
+// providers, serving a host profile given as text, with the answers reduced to what a client compares. One provider
 // is also registered for a class of the test's own MOF that it does not
 // serve, so that its answer to an unknown class can be seen.
 #pragma once
@@ -29,8 +29,9 @@ protected:
     ProductBroker(const char *served, const char *unserved) : servedClass(served), unservedClass(unserved) {}
 
     void SetUp() override {
-        BrokerConfig config =
-            loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
+        BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR, TVX_HOST_PROVIDER_DIR},
+                                               {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
+                                               {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF, TVX_TEST_MOF});
         for (ProviderRegistration registration : std::vector<ProviderRegistration>(config.registrations)) {
             if (registration.className != servedClass) continue;
             registration.className = unservedClass;

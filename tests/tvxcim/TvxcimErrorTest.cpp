@@ -46,6 +46,8 @@ TEST(TvxcimErrorTest, BadInputEndsInOneLineAndItsStatus) {
         {"GarbledRegistration",
          withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_MOF, TVX_TESTPROVIDER_MOF, {"ei", "Test_Widget"}), 1,
          std::string(TVX_TESTPROVIDER_MOF) + ":1: expected 'key: value'"},
+        {"ClassInTwoRegistrations", onTestProviders({"--registration", TVX_TESTPROVIDER_REG, "ei", "Test_Widget"}), 1,
+         std::string(TVX_TESTPROVIDER_REG) + ": class Test_Widget is registered by an earlier registration file too"},
         {"MissingMof", withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_REG, kMissingFile, {"ei", "Test_Widget"}), 1,
          std::string("cannot read ") + kMissingFile},
         {"MissingProviderDirectory",

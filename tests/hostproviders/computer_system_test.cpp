@@ -1,0 +1,107 @@
+// OMC_UnitaryComputerSystem through the embedded broker: the one system,
+// named as the product names the host in its own paths, and NOT_FOUND for
+// every other path, to a client and to a provider's up-call alike (an
+// up-call answered OK without an instance kills sfcb's provider process).
+#include "CmpiBroker.h"
+#include "CmpiObjectPath.h"
+#include "CmpiStatus.h"
+#include "ProductBroker.h"
+#include "core/ObjectPool.h"
+
+namespace {
+
+using namespace producttest;
+
+constexpr const char *kClass = "OMC_UnitaryComputerSystem";
+constexpr const char *kUnserved = "Test_UnservedComputerSystem";
+
+class ComputerSystemProvider : public ProductBroker {
+protected:
+    ComputerSystemProvider() : ProductBroker(kClass, kUnserved) {}
+
+    ObjectPath systemPath(const std::string &cls, const CimValue &creationClassName, const CimValue &name) const {
+        return ObjectPath{"", kNs, cls, {{"CreationClassName", creationClassName}, {"Name", name}}};
+    }
+
+    // The status a provider's getInstance up-call for `path` ends in.
+    CMPIrc upCallStatus(const ObjectPath &path) const {
+        const RequestScope request;
+        const CmpiBroker up(broker->cmpiBroker());
+        CmpiObjectPath cop(kNs, path.className.c_str());
+        for (const NamedValue &key : path.keys) {
+            if (key.value.type == CMPI_string) cop.setKey(key.name.c_str(), CmpiData(key.value.text));
+            else cop.setKey(key.name.c_str(), CmpiData(CMPIUint32(key.value.unsignedValue)));
+        }
+        try {
+            up.getInstance(CmpiContext(broker->newContext(kNs)), cop, nullptr);
+        } catch (const CmpiStatus &status) {
+            return status.rc();
+        }
+        return CMPI_RC_OK;
+    }
+};
+
+TEST_F(ComputerSystemProvider, ServesTheOneSystemThatTheProductsPathsName) {
+    const Response names = broker->enumInstanceNames(classPath(kClass));
+    const Response instances = broker->enumInstances(classPath(kClass), {});
+    ASSERT_TRUE(names.ok());
+    ASSERT_TRUE(instances.ok());
+    ASSERT_EQ(names.paths.size(), 1u);
+    ASSERT_EQ(instances.instances.size(), 1u);
+    const std::string quotedHost = "\"" + hostName + "\"";
+    const std::map<std::string, std::string> expected = {
+        {"CreationClassName", "\"OMC_UnitaryComputerSystem\""},
+        {"Name", quotedHost},
+        {"ElementName", quotedHost},
+        {"Dedicated", "{0}"},
+        {"EnabledState", "2"},
+    };
+    for (const auto &[property, literal] : expected) {
+        EXPECT_EQ(literals(instances.instances[0])[property], literal) << property;
+    }
+    EXPECT_EQ(pathTexts(names), pathTexts(instances));
+
+    // The keys every product device carries name this instance.
+    const Response processors = broker->enumInstances(classPath("Talvex_Processor"), {});
+    ASSERT_TRUE(processors.ok());
+    ASSERT_FALSE(processors.instances.empty());
+    const Instance &device = processors.instances[0];
+    const Response system = broker->getInstance(
+        systemPath(kClass, *device.property("SystemCreationClassName"), *device.property("SystemName")), {});
+    ASSERT_TRUE(system.ok()) << system.rc;
+    EXPECT_EQ(pathTexts(system), pathTexts(names));
+    EXPECT_EQ(upCallStatus(names.paths[0]), CMPI_RC_OK);
+
+    const Response onlyElementName = broker->enumInstances(classPath(kClass), std::vector<std::string>{"ElementName"});
+    ASSERT_EQ(onlyElementName.instances.size(), 1u);
+    EXPECT_EQ(literals(onlyElementName.instances[0]).count("Dedicated"), 0u);
+    EXPECT_EQ(literals(onlyElementName.instances[0])["ElementName"], quotedHost);
+}
+
+TEST_F(ComputerSystemProvider, EveryOtherPathIsNotFoundToClientsAndUpCalls) {
+    const CimValue systemClass = CimValue::makeString(kClass);
+    const CimValue host = CimValue::makeString(hostName);
+    const struct {
+        const char *what;
+        ObjectPath path;
+    } cases[] = {
+        {"another host name", systemPath(kClass, systemClass, CimValue::makeString(hostName + "x"))},
+        {"an empty name", systemPath(kClass, systemClass, CimValue::makeString(""))},
+        {"a name that is no text", systemPath(kClass, systemClass, CimValue::makeUnsigned(CMPI_uint32, 7))},
+        {"another creation class", systemPath(kClass, CimValue::makeString("CIM_ComputerSystem"), host)},
+        {"no name", ObjectPath{"", kNs, kClass, {{"CreationClassName", systemClass}}}},
+        {"no creation class", ObjectPath{"", kNs, kClass, {{"Name", host}}}},
+        {"another class", systemPath(kUnserved, systemClass, host)},
+    };
+    for (const auto &c : cases) {
+        const Response response = broker->getInstance(c.path, {});
+        EXPECT_EQ(response.rc, CMPI_RC_ERR_NOT_FOUND) << c.what;
+        EXPECT_TRUE(response.instances.empty()) << c.what;
+        EXPECT_EQ(upCallStatus(c.path), CMPI_RC_ERR_NOT_FOUND) << c.what;
+    }
+    const Response other = broker->enumInstanceNames(classPath(kUnserved));
+    EXPECT_TRUE(other.ok());
+    EXPECT_TRUE(other.paths.empty());
+}
+
+}  // namespace
