@@ -41,7 +41,8 @@ set(expected
   "instance of Talvex_HypervisorSoftwareIdentity\n[^}]*InstanceID = \"Alt Boot Bank: Talvex Corlai 5.1.0 build-799733\";"
   "instance of OMC_UnitaryComputerSystem\n[^}]*\n    Name = \"${host}\";[^}]*ElementName = \"${host}\";"
   "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
-  "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"")
+  "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\""
+  "== ain root/cimv2:OMC_UnitaryComputerSystem[^\n]*\nroot/cimv2:Talvex_HypervisorSoftwareIdentity.InstanceID=\"Talvex Corlai 5.1.0 build-1483097\"\n\n")
 foreach(pattern IN LISTS expected)
   if(NOT shown MATCHES "${pattern}")
     message(FATAL_ERROR "tvxcim demo did not show '${pattern}':\n${shown}")

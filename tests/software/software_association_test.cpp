@@ -107,6 +107,43 @@ TEST_F(InstalledSoftware, GetInstanceAsksTheSoftwareProvider) {
     }
 }
 
+// Traversals reach the stand-in's real computer system and the software
+// provider's real images; roles are compared without regard to case, and
+// the alternate image is never installed software.
+TEST_F(InstalledSoftware, TraversalsFromBothEnds) {
+    const ObjectPath system{"", kNs, "OMC_UnitaryComputerSystem",
+                            {{"Name", CimValue::makeString(hostName)},
+                             {"CreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")}}};
+    const struct {
+        ObjectPath from;
+        const char *resultClass, *role, *resultRole;
+        const char *found;  // class of the one associator; null: none
+    } cases[] = {
+        {system, "", "", "", "Talvex_HypervisorSoftwareIdentity"},
+        {system, "CIM_SoftwareIdentity", "system", "INSTALLEDSOFTWARE", "Talvex_HypervisorSoftwareIdentity"},
+        {system, "CIM_LogicalDevice", "", "", nullptr},
+        {system, "", "InstalledSoftware", "", nullptr},
+        {system, "", "", "System", nullptr},
+        {softwarePath(kRunningId), "", "", "", "OMC_UnitaryComputerSystem"},
+        {softwarePath(kRunningId), "CIM_ComputerSystem", "installedsoftware", "SYSTEM", "OMC_UnitaryComputerSystem"},
+        {softwarePath(kRunningId), "CIM_SoftwareIdentity", "", "", nullptr},
+        {softwarePath(kRunningId), "", "System", "", nullptr},
+        {softwarePath(kAltId), "", "", "", nullptr},
+    };
+    for (const auto &c : cases) {
+        SCOPED_TRACE(formatPath(c.from) + " " + c.resultClass + " " + c.role + " " + c.resultRole);
+        const Response associators = broker->associators(c.from, kClass, c.resultClass, c.role, c.resultRole, {});
+        ASSERT_TRUE(associators.ok()) << associators.rc;
+        ASSERT_EQ(associators.instances.size(), c.found ? 1u : 0u);
+        const Response references = broker->references(c.from, kClass, c.role, {});
+        ASSERT_TRUE(references.ok()) << references.rc;
+        if (c.found == nullptr) continue;
+        EXPECT_EQ(associators.instances[0].path.className, c.found);
+        ASSERT_FALSE(references.instances.empty());
+        EXPECT_EQ(referenceOf(references.instances[0].path, "InstalledSoftware").key("InstanceID")->text, kRunningId);
+    }
+}
+
 // Without a software identity provider the up-call enumeration is empty,
 // and then the association answers nothing at all, not even its end.
 TEST(InstalledSoftwareAlone, NothingAndNoEndWithoutSoftware) {
