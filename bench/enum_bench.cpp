@@ -141,6 +141,10 @@ int main(int argc, char **argv) {
         const auto large = figures.find(pair.large);
         if (small == figures.end() || large == figures.end()) continue;
         const double perRequest = large->second.nanosPerRequest / small->second.nanosPerRequest;
+        if (small->second.instances == large->second.instances) {
+            std::printf("%s: %.0f times as long\n", pair.what, perRequest);
+            continue;
+        }
         const double perInstance = perRequest * small->second.instances / large->second.instances;
         std::printf("%s: %.0f times as long, %.2f times as long per instance\n", pair.what, perRequest,
                     perInstance);
