@@ -26,33 +26,31 @@ void serve(const std::string &profile) {
     ASSERT_EQ(HostSim_LoadProfileText(profile.c_str(), error, sizeof error), 0) << error;
 }
 
+// The number itself, or the third of three; anything else is -1.
+TEST(BootBank, BuildNumbers) {
+    const std::pair<std::string, std::int32_t> cases[] = {
+        {"654321", 654321}, {"0.0.654321", 654321}, {"0", 0}, {"2147483647", 2147483647}, {"0654321", -1},
+        {"+654321", -1}, {"-654321", -1}, {"1.2", -1}, {"1.2.3.4", -1}, {"1..3", -1}, {"1.2.3x", -1},
+        {"abc", -1}, {"1 2", -1}, {"", -1}, {"2147483648", -1}, {std::string(100000, '1'), -1},
+    };
+    for (const auto &[text, build] : cases) EXPECT_EQ(buildNumberOf(text), build) << text.substr(0, 20);
+}
+
 TEST(BootBank, EveryShapeOfTheBuildLine) {
-    const std::string longVersion(40, '7');
     const struct {
         std::string content;
         const char *version;  // null: the all-zero record
         std::int32_t build;
     } cases[] = {
-        {"build=5.1.0-654321\n", "5.1.0", 654321},
         {"build=5.1.0-0.0.654321\n", "5.1.0", 654321},
         {"build=5.1.0-654321  \t\r\n", "5.1.0", 654321},
-        {"build=5.1.0-0654321\n", "5.1.0", -1},
-        {"build=5.1.0-0\n", "5.1.0", 0},
-        {"build=5.1.0-+654321\n", "5.1.0", -1},
-        {"build=5.1.0--654321\n", "5.1.0", -1},
-        {"build=5.1.0-1.2\n", "5.1.0", -1},
-        {"build=5.1.0-1.2.3.4\n", "5.1.0", -1},
-        {"build=5.1.0-1.2.3x\n", "5.1.0", -1},
-        {"build=5.1.0-2147483647\n", "5.1.0", 2147483647},
-        {"build=5.1.0-2147483648\n", "5.1.0", -1},
         {"build=5.1.0-", "5.1.0", -1},
-        {"build=" + longVersion + "-42\n", "7777777777777777777777777777777", 42},
+        {"build=" + std::string(40, '7') + "-42\n", "7777777777777777777777777777777", 42},
         {"build=5.1.0\n", nullptr, 0},
         {"kernel=b.b00\n", nullptr, 0},
         {" build=5.1.0-1\nBUILD=5.1.0-2\n", nullptr, 0},
         {"a=1\nbuild=5.1.0-11\nbuild=6.0.0-22\n", "5.1.0", 11},
         {std::string(100000, 'x') + "\nbuild=5.1.0-3\n", "5.1.0", 3},
-        {"build=5.1.0-" + std::string(100000, '1') + "\n", "5.1.0", -1},
         {std::string("build=5.1\0.0-4\n", 15), nullptr, 0},
     };
     const BootBankFile file("");
