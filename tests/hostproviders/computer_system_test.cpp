@@ -41,27 +41,12 @@ protected:
     }
 };
 
+// The keys every product device carries name this one instance.
 TEST_F(ComputerSystemProvider, ServesTheOneSystemThatTheProductsPathsName) {
     const Response names = broker->enumInstanceNames(classPath(kClass));
-    const Response instances = broker->enumInstances(classPath(kClass), {});
     ASSERT_TRUE(names.ok());
-    ASSERT_TRUE(instances.ok());
     ASSERT_EQ(names.paths.size(), 1u);
-    ASSERT_EQ(instances.instances.size(), 1u);
-    const std::string quotedHost = "\"" + hostName + "\"";
-    const std::map<std::string, std::string> expected = {
-        {"CreationClassName", "\"OMC_UnitaryComputerSystem\""},
-        {"Name", quotedHost},
-        {"ElementName", quotedHost},
-        {"Dedicated", "{0}"},
-        {"EnabledState", "2"},
-    };
-    for (const auto &[property, literal] : expected) {
-        EXPECT_EQ(literals(instances.instances[0])[property], literal) << property;
-    }
-    EXPECT_EQ(pathTexts(names), pathTexts(instances));
-
-    // The keys every product device carries name this instance.
+    EXPECT_EQ(names.paths[0].key("Name")->text, hostName);
     const Response processors = broker->enumInstances(classPath("Talvex_Processor"), {});
     ASSERT_TRUE(processors.ok());
     ASSERT_FALSE(processors.instances.empty());
@@ -70,12 +55,14 @@ TEST_F(ComputerSystemProvider, ServesTheOneSystemThatTheProductsPathsName) {
         systemPath(kClass, *device.property("SystemCreationClassName"), *device.property("SystemName")), {});
     ASSERT_TRUE(system.ok()) << system.rc;
     EXPECT_EQ(pathTexts(system), pathTexts(names));
+    EXPECT_EQ(literals(system.instances.at(0))["ElementName"], "\"" + hostName + "\"");
+    EXPECT_EQ(literals(system.instances.at(0))["EnabledState"], "2");
+    EXPECT_EQ(literals(system.instances.at(0))["Dedicated"], "{0}");
     EXPECT_EQ(upCallStatus(names.paths[0]), CMPI_RC_OK);
 
     const Response onlyElementName = broker->enumInstances(classPath(kClass), std::vector<std::string>{"ElementName"});
     ASSERT_EQ(onlyElementName.instances.size(), 1u);
     EXPECT_EQ(literals(onlyElementName.instances[0]).count("Dedicated"), 0u);
-    EXPECT_EQ(literals(onlyElementName.instances[0])["ElementName"], quotedHost);
 }
 
 TEST_F(ComputerSystemProvider, EveryOtherPathIsNotFoundToClientsAndUpCalls) {

@@ -2,22 +2,19 @@
 // shipped library, as far as the association's instance side goes: the
 // software side comes from the software identity provider by up-calls, and
 // the alternate boot bank's image is never installed software.
-#include <unistd.h>
-
 #include <algorithm>
-#include <cstdio>
-#include <fstream>
 
 #include "ProductBroker.h"
+#include "SoftwareTesting.h"
 
 namespace {
 
 using namespace producttest;
+using softwaretest::kAltId;
+using softwaretest::kRunningId;
 
 constexpr const char *kClass = "Talvex_InstalledSoftwareIdentity";
 constexpr const char *kUnserved = "Test_UnservedInstalledSoftware";
-constexpr const char *kRunningId = "Talvex Corlai 5.1.0 build-1483097";
-constexpr const char *kAltId = "Alt Boot Bank: Talvex Corlai 5.1.0 build-654321";
 
 ObjectPath softwarePath(const std::string &instanceId) {
     return ObjectPath{"", kNs, "Talvex_HypervisorSoftwareIdentity",
@@ -36,28 +33,23 @@ protected:
     InstalledSoftware() : ProductBroker(kClass, kUnserved) {}
 
     void SetUp() override {
-        bootCfg = testing::TempDir() + "installed_software_" + std::to_string(::getpid()) + ".cfg";
-        std::ofstream(bootCfg) << "build=5.1.0-654321\n";
-        ::setenv("TVX_ALTBOOTBANK_CFG", bootCfg.c_str(), 1);
         ProductBroker::SetUp();
         serve(R"({"hostType": "Corlai"})");
     }
-    void TearDown() override {
-        ProductBroker::TearDown();
-        ::unsetenv("TVX_ALTBOOTBANK_CFG");
-        std::remove(bootCfg.c_str());
+
+    ObjectPath systemPath() const {
+        return ObjectPath{"", kNs, "OMC_UnitaryComputerSystem",
+                          {{"Name", CimValue::makeString(hostName)},
+                           {"CreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")}}};
     }
 
     ObjectPath associationPath(const std::string &instanceId, const char *cls = kClass) const {
-        const ObjectPath system{"", kNs, "OMC_UnitaryComputerSystem",
-                                {{"Name", CimValue::makeString(hostName)},
-                                 {"CreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")}}};
         return ObjectPath{"", kNs, cls,
-                          {{"System", CimValue::makeReference(system)},
+                          {{"System", CimValue::makeReference(systemPath())},
                            {"InstalledSoftware", CimValue::makeReference(softwarePath(instanceId))}}};
     }
 
-    std::string bootCfg;
+    softwaretest::BootBankFile bootCfg{"build=5.1.0-654321\n"};
 };
 
 TEST_F(InstalledSoftware, OneNameForTheRunningImageOnly) {
@@ -65,18 +57,9 @@ TEST_F(InstalledSoftware, OneNameForTheRunningImageOnly) {
     ASSERT_TRUE(names.ok());
     ASSERT_EQ(names.paths.size(), 1u);
     EXPECT_TRUE(names.done);
-    const ObjectPath &software = referenceOf(names.paths[0], "InstalledSoftware");
-    EXPECT_EQ(software.key("InstanceID")->text, kRunningId);
-    const ObjectPath &system = referenceOf(names.paths[0], "System");
-    EXPECT_EQ(system.nameSpace, "/root/cimv2");
-    EXPECT_EQ(system.className, "OMC_UnitaryComputerSystem");
-    EXPECT_EQ(system.key("Name")->text, hostName);
-    EXPECT_EQ(system.key("CreationClassName")->text, "OMC_UnitaryComputerSystem");
-
-    const Response instances = broker->enumInstances(classPath(kClass), {});
-    ASSERT_TRUE(instances.ok());
-    ASSERT_EQ(instances.instances.size(), 1u);
-    EXPECT_EQ(referenceOf(instances.instances[0].path, "InstalledSoftware").key("InstanceID")->text, kRunningId);
+    EXPECT_EQ(referenceOf(names.paths[0], "InstalledSoftware").key("InstanceID")->text, kRunningId);
+    EXPECT_EQ(referenceOf(names.paths[0], "System").nameSpace, "/root/cimv2");
+    EXPECT_EQ(pathTexts(broker->enumInstances(classPath(kClass), {})), pathTexts(names));
 
     const Response other = broker->enumInstanceNames(classPath(kUnserved));
     EXPECT_TRUE(other.ok() && other.paths.empty() && !other.done);
@@ -111,9 +94,7 @@ TEST_F(InstalledSoftware, GetInstanceAsksTheSoftwareProvider) {
 // provider's real images; roles are compared without regard to case, and
 // the alternate image is never installed software.
 TEST_F(InstalledSoftware, TraversalsFromBothEnds) {
-    const ObjectPath system{"", kNs, "OMC_UnitaryComputerSystem",
-                            {{"Name", CimValue::makeString(hostName)},
-                             {"CreationClassName", CimValue::makeString("OMC_UnitaryComputerSystem")}}};
+    const ObjectPath system = systemPath();
     const struct {
         ObjectPath from;
         const char *resultClass, *role, *resultRole;
