@@ -5,9 +5,9 @@
 #include <benchmark/benchmark.h>
 
 #include <cstdio>
-#include <map>
 #include <string>
 
+#include "FigureKeepingReporter.h"
 #include "core/Broker.h"
 #include "hostsim/HostSimControl.h"
 
@@ -15,11 +15,6 @@ namespace {
 
 using namespace tvxbroker;
 
-struct Figures {
-    double nanosPerRequest;
-    double instances;
-};
-std::map<std::string, Figures> figures;
 
 // Runs `request` on the host of `profileFile` (null: the default host).
 template <class Request>
@@ -104,50 +99,26 @@ BENCHMARK_CAPTURE(enumerate, endpoints_4096Interfaces, "CIM_IPProtocolEndpoint",
                   TVX_PROFILE_DIR "/interfaces-4096.json")
     ->Unit(benchmark::kMillisecond);
 
-class RatioReporter : public benchmark::ConsoleReporter {
-public:
-    RatioReporter() : ConsoleReporter(OO_Tabular) {}
-
-    void ReportRuns(const std::vector<Run> &runs) override {
-        for (const Run &run : runs) {
-            if (run.iterations == 0) continue;
-            const auto instances = run.counters.find("instances");
-            figures[run.benchmark_name()] = {run.GetAdjustedRealTime() * unitNanos(run.time_unit),
-                                             instances != run.counters.end() ? double(instances->second) : 0};
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-
-private:
-    static double unitNanos(benchmark::TimeUnit unit) {
-        switch (unit) {
-            case benchmark::kMicrosecond: return 1e3;
-            case benchmark::kMillisecond: return 1e6;
-            case benchmark::kSecond: return 1e9;
-            default: return 1;
-        }
-    }
-};
-
 }  // namespace
 
 int main(int argc, char **argv) {
     benchmark::Initialize(&argc, argv);
-    RatioReporter reporter;
+    FigureKeepingReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     benchmark::Shutdown();
     for (const HostPair &pair : pairs) {
-        const auto small = figures.find(pair.small);
-        const auto large = figures.find(pair.large);
-        if (small == figures.end() || large == figures.end()) continue;
-        const double perRequest = large->second.nanosPerRequest / small->second.nanosPerRequest;
-        if (small->second.instances == large->second.instances) {
+        const RunFigures *small = reporter.find(pair.small);
+        const RunFigures *large = reporter.find(pair.large);
+        if (small == nullptr || large == nullptr) continue;
+        const double perRequest = large->secondsPerIteration / small->secondsPerIteration;
+        const double smallInstances = small->counters.at("instances");
+        const double largeInstances = large->counters.at("instances");
+        if (smallInstances == largeInstances) {
             std::printf("%s: %.0f times as long\n", pair.what, perRequest);
             continue;
         }
-        const double perInstance = perRequest * small->second.instances / large->second.instances;
         std::printf("%s: %.0f times as long, %.2f times as long per instance\n", pair.what, perRequest,
-                    perInstance);
+                    perRequest * smallInstances / largeInstances);
     }
     return 0;
 }

@@ -7,10 +7,10 @@
 #include <benchmark/benchmark.h>
 
 #include <cstdio>
-#include <map>
 #include <string>
 
 #include "CmpiBroker.h"
+#include "FigureKeepingReporter.h"
 #include "ScriptedInterfaceAddresses.h"
 #include "cmpi/cmpi_context_ext.h"
 #include "core/Broker.h"
@@ -84,37 +84,21 @@ void detectionCycle(benchmark::State &state) {
 BENCHMARK(detectionCycle)->Arg(16)->Unit(benchmark::kMicrosecond);
 BENCHMARK(detectionCycle)->Arg(1024)->Unit(benchmark::kMillisecond);
 
-// Keeps each run's CPU seconds per address for the comparison at the end.
-class PerAddressReporter : public benchmark::ConsoleReporter {
-public:
-    PerAddressReporter() : ConsoleReporter(OO_Tabular) {}
-
-    void ReportRuns(const std::vector<Run> &runs) override {
-        for (const Run &run : runs) {
-            const auto perAddress = run.counters.find("per_address");
-            if (run.iterations > 0 && perAddress != run.counters.end()) {
-                secondsPerAddress[run.benchmark_name()] = perAddress->second.value;
-            }
-        }
-        ConsoleReporter::ReportRuns(runs);
-    }
-
-    std::map<std::string, double> secondsPerAddress;
-};
-
 }  // namespace
 
 int main(int argc, char **argv) {
     benchmark::Initialize(&argc, argv);
-    PerAddressReporter reporter;
+    FigureKeepingReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     benchmark::Shutdown();
-    const auto small = reporter.secondsPerAddress.find("detectionCycle/16");
-    const auto large = reporter.secondsPerAddress.find("detectionCycle/1024");
-    if (small != reporter.secondsPerAddress.end() && large != reporter.secondsPerAddress.end()) {
+    const RunFigures *small = reporter.find("detectionCycle/16");
+    const RunFigures *large = reporter.find("detectionCycle/1024");
+    if (small != nullptr && large != nullptr) {
+        const double smallSeconds = small->counters.at("per_address");
+        const double largeSeconds = large->counters.at("per_address");
         std::printf("one detection cycle, CPU time per address: %.0f ns on 16 interfaces, %.0f ns on 1,024; "
                     "%.2f times as much on the large host (goal: within 1.3)\n",
-                    small->second * 1e9, large->second * 1e9, large->second / small->second);
+                    smallSeconds * 1e9, largeSeconds * 1e9, largeSeconds / smallSeconds);
     }
     return 0;
 }

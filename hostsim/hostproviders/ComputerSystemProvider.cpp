@@ -1,10 +1,10 @@
 #include "ComputerSystemProvider.h"
 
-#include <optional>
 #include <string>
 
 #include "CmpiArray.h"
 #include "CmpiObjectPath.h"
+#include "frame/KeyText.h"
 #include "platform/OmcComputerSystem.h"
 
 namespace HostProviders {
@@ -17,18 +17,9 @@ bool servedClass(const CmpiObjectPath &cop) {
     return cop.getClassName().equalsIgnoreCase(OMC::getComputerSystemClassName().c_str());
 }
 
-// An absent key, or one that is not text, names no system.
-std::optional<std::string> keyText(const CmpiObjectPath &cop, const char *key) {
-    const CmpiData value = cop.getKey(key);
-    if (value.isNotFound() || value.isNullValue()) return std::nullopt;
-    if (value.type() != CMPI_string && value.type() != CMPI_chars) return std::nullopt;
-    const char *text = value;
-    return text != nullptr ? std::optional<std::string>(text) : std::nullopt;
-}
-
 bool namesSystem(const CmpiObjectPath &cop, const std::string &name) {
-    const std::optional<std::string> className = keyText(cop, "CreationClassName");
-    const std::optional<std::string> keyName = keyText(cop, "Name");
+    const std::optional<std::string> className = frame::keyText(cop, "CreationClassName");
+    const std::optional<std::string> keyName = frame::keyText(cop, "Name");
     return className && CmpiString(*className).equalsIgnoreCase(OMC::getComputerSystemClassName().c_str()) &&
            keyName == name;
 }

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "CmpiProviderFactory.h"
+#include "frame/KeyText.h"
 #include "platform/OmcMutex.h"
 #include "software/BootBank.h"
 #include "software/HypervisorVersions.h"
@@ -18,12 +19,6 @@ using Software::hypervisorIdentityClass;
 using Software::makeInstanceId;
 
 const char *textOf(const CmpiString &text) { return text.isNull() ? "" : text.charPtr(); }
-
-std::string instanceIdOf(const CmpiObjectPath &cop) {
-    const CmpiData key = cop.getKey("InstanceID");
-    if (key.isNotFound() || key.isNullValue() || (key.type() != CMPI_string && key.type() != CMPI_chars)) return "";
-    return textOf(key);
-}
 
 // What each operation logs when asked for another class: the requested
 // class and the served one, where the text has room for them.
@@ -88,7 +83,7 @@ public:
         versions.gatherVersions();
         CmpiInstance instance(CmpiObjectPath(cop.getNameSpace(), hypervisorIdentityClass));
         instance.setPropertyFilter(properties, nullptr);
-        const std::string instanceId = instanceIdOf(cop);
+        const std::string instanceId = frame::keyText(cop, "InstanceID").value_or("");
         const SystemVersionInfo *found = nullptr;
         for (const SystemVersionInfo *record : records()) {
             if (instanceId == makeInstanceId(*record)) {

@@ -4,6 +4,7 @@
 // alternate boot bank is not installed software and is always left out.
 #include "CmpiProviderFactory.h"
 #include "CmpiResultFilters.h"
+#include "frame/KeyText.h"
 #include "frame/ReferenceFilters.h"
 #include "platform/OmcComputerSystem.h"
 #include "platform/OmcSimpleAssociationMI.h"
@@ -19,11 +20,8 @@ using Software::hypervisorIdentityClass;
 using Software::installedSoftwareClass;
 
 bool isAltBootBank(const CmpiObjectPath &software) {
-    const CmpiData key = software.getKey("InstanceID");
-    if (key.isNotFound() || key.isNullValue() || (key.type() != CMPI_string && key.type() != CMPI_chars)) {
-        return false;
-    }
-    return Software::isAltBootBankId(key);
+    const std::optional<std::string> instanceId = frame::keyText(software, "InstanceID");
+    return instanceId && Software::isAltBootBankId(instanceId->c_str());
 }
 
 class TalvexInstalledSoftwareIdentity : public virtual CmpiInstanceMI, public virtual OMC::SimpleAssociationMI {
@@ -35,18 +33,12 @@ public:
     CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop) override {
         if (!cop.classPathIsA(installedSoftwareClass)) return CmpiStatus(CMPI_RC_OK);
         const CmpiObjectPath system = Software::installedSystemPath(installed, Software::installedSystemNamespace);
-        const CmpiEnumeration names =
-            getBroker()->enumInstanceNames(ctx, CmpiObjectPath(cop.getNameSpace(), hypervisorIdentityClass));
-        if (!names.hasNext()) return CmpiStatus(CMPI_RC_OK);
-        while (names.hasNext()) {
-            const CmpiObjectPath software = names.getNext();
-            if (isAltBootBank(software)) continue;
+        returnInstalledImages(ctx, rslt, cop.getNameSpace(), [&](const CmpiObjectPath &software) {
             CmpiObjectPath association = cop;
             association.setKey("System", CmpiData(system));
             association.setKey("InstalledSoftware", CmpiData(software));
-            rslt.returnData(association);
-        }
-        rslt.returnDone();
+            return association;
+        });
         return CmpiStatus(CMPI_RC_OK);
     }
 
@@ -94,16 +86,10 @@ public:
             }
             CmpiInstance association(CmpiObjectPath(ns, installedSoftwareClass));
             association.setProperty("System", CmpiData(op));
-            const CmpiEnumeration names =
-                getBroker()->enumInstanceNames(ctx, CmpiObjectPath(ns, hypervisorIdentityClass));
-            if (!names.hasNext()) return CmpiStatus(CMPI_RC_OK);
-            while (names.hasNext()) {
-                const CmpiObjectPath software = names.getNext();
-                if (isAltBootBank(software)) continue;
+            returnInstalledImages(ctx, rslt, ns, [&](const CmpiObjectPath &software) -> const CmpiInstance & {
                 association.setProperty("InstalledSoftware", CmpiData(software));
-                rslt.returnData(association);
-            }
-            rslt.returnDone();
+                return association;
+            });
             return CmpiStatus(CMPI_RC_OK);
         }
         if (op.classPathIsA(hypervisorIdentityClass)) {
@@ -121,6 +107,21 @@ public:
     }
 
 private:
+    // Returns what `associationOf` makes of each image the broker names, the
+    // alternate one left out, then the end; nothing at all, not even the
+    // end, when the broker names none.
+    template <class AssociationOf>
+    void returnInstalledImages(const CmpiContext &ctx, CmpiResult &rslt, const CmpiString &ns,
+                               AssociationOf associationOf) {
+        const CmpiEnumeration names = getBroker()->enumInstanceNames(ctx, CmpiObjectPath(ns, hypervisorIdentityClass));
+        if (!names.hasNext()) return;
+        while (names.hasNext()) {
+            const CmpiObjectPath software = names.getNext();
+            if (!isAltBootBank(software)) rslt.returnData(associationOf(software));
+        }
+        rslt.returnDone();
+    }
+
     Software::InstalledSystem installed{};
 };
 

@@ -3,7 +3,6 @@
 #include <arpa/inet.h>
 
 #include "CmpiObjectPath.h"
-#include "platform/OmcComputerSystem.h"
 
 namespace TVX {
 namespace {
@@ -27,13 +26,7 @@ CmpiInstance buildEndpointInstance(const endpointDetails &record, const CmpiStri
     CmpiInstance instance(CmpiObjectPath(ns, className));
     instance.setPropertyFilter(properties, nullptr);
 
-    instance.setProperty("SystemCreationClassName", CmpiData(OMC::getComputerSystemClassName()));
-    instance.setProperty("SystemName", CmpiData(OMC::getComputerSystemName(ctx, broker)));
-    instance.setProperty("CreationClassName", CmpiData(className));
-    instance.setProperty("Name", CmpiData(record.name));
-    instance.setProperty("ElementName", CmpiData(record.name));
-    instance.setProperty("NameFormat", CmpiData("Ostrakon Interface Name"));
-    instance.setProperty("ProtocolIFType", CmpiData(CMPIUint16(record.protocolType)));
+    setEndpointIdentity(instance, className, record.name, record.protocolType, ctx, broker);
     if (record.protocolType == protocolIPv4) {
         instance.setProperty("IPv4Address", dottedDecimal(record.ipv4Address));
         instance.setProperty("SubnetMask", dottedDecimal(record.ipv4Netmask));

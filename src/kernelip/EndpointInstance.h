@@ -5,11 +5,9 @@
 #include "CmpiInstance.h"
 #include "CmpiString.h"
 #include "kernelip/EndpointDetails.h"
+#include "kernelip/EndpointProperties.h"
 
 namespace TVX {
-
-constexpr const char *ipv4EndpointClass = "Talvex_KernelIPv4ProtocolEndpoint";
-constexpr const char *ipv6EndpointClass = "Talvex_KernelIPv6ProtocolEndpoint";
 
 // Properties outside the list are left out by the instance's own filter.
 CmpiInstance buildEndpointInstance(const endpointDetails &record, const CmpiString &ns,

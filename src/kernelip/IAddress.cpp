@@ -2,7 +2,7 @@
 
 #include <stdexcept>
 
-#include "platform/OmcComputerSystem.h"
+#include "kernelip/EndpointProperties.h"
 
 namespace TVX {
 namespace {
@@ -23,13 +23,7 @@ CmpiInstance IAddress::newEndpointInstance(const CmpiContext &ctx, CmpiBroker *b
                                            std::int32_t protocolIFType) const {
     const std::string className = getCreationClassName();
     CmpiInstance instance(CmpiObjectPath(kKernelIpNamespace, className.c_str()));
-    instance.setProperty("SystemCreationClassName", CmpiData(OMC::getComputerSystemClassName()));
-    instance.setProperty("SystemName", CmpiData(OMC::getComputerSystemName(ctx, broker)));
-    instance.setProperty("CreationClassName", CmpiData(className));
-    instance.setProperty("Name", CmpiData(interfaceName));
-    instance.setProperty("ElementName", CmpiData(interfaceName));
-    instance.setProperty("NameFormat", CmpiData("Ostrakon Interface Name"));
-    instance.setProperty("ProtocolIFType", CmpiData(static_cast<CMPIUint16>(protocolIFType)));
+    setEndpointIdentity(instance, className.c_str(), interfaceName.c_str(), protocolIFType, ctx, broker);
     return instance;
 }
 

@@ -7,6 +7,7 @@
 #include <stdexcept>
 
 #include "kernelip/EndpointDetails.h"
+#include "kernelip/EndpointProperties.h"
 
 namespace TVX {
 namespace {
@@ -43,6 +44,6 @@ bool IPv4Address::isEqual(const IAddress *other) const {
 
 std::string IPv4Address::getAddress() const { return address; }
 
-std::string IPv4Address::getCreationClassName() const { return "Talvex_KernelIPv4ProtocolEndpoint"; }
+std::string IPv4Address::getCreationClassName() const { return ipv4EndpointClass; }
 
 }  // namespace TVX

@@ -6,6 +6,7 @@
 #include <cstring>
 
 #include "kernelip/EndpointDetails.h"
+#include "kernelip/EndpointProperties.h"
 
 namespace TVX {
 namespace {
@@ -57,6 +58,6 @@ bool IPv6Address::isEqual(const IAddress *other) const {
 
 std::string IPv6Address::getAddress() const { return address; }
 
-std::string IPv6Address::getCreationClassName() const { return "Talvex_KernelIPv6ProtocolEndpoint"; }
+std::string IPv6Address::getCreationClassName() const { return ipv6EndpointClass; }
 
 }  // namespace TVX
