@@ -36,3 +36,10 @@ public:
 private:
     std::map<std::string, RunFigures> figures;
 };
+
+// Runs what the command line selects, keeping the figures in `reporter`.
+inline void runBenchmarks(int argc, char **argv, FigureKeepingReporter &reporter) {
+    benchmark::Initialize(&argc, argv);
+    benchmark::RunSpecifiedBenchmarks(&reporter);
+    benchmark::Shutdown();
+}

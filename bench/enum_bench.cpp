@@ -102,10 +102,8 @@ BENCHMARK_CAPTURE(enumerate, endpoints_4096Interfaces, "CIM_IPProtocolEndpoint",
 }  // namespace
 
 int main(int argc, char **argv) {
-    benchmark::Initialize(&argc, argv);
     FigureKeepingReporter reporter;
-    benchmark::RunSpecifiedBenchmarks(&reporter);
-    benchmark::Shutdown();
+    runBenchmarks(argc, argv, reporter);
     for (const HostPair &pair : pairs) {
         const RunFigures *small = reporter.find(pair.small);
         const RunFigures *large = reporter.find(pair.large);

@@ -87,10 +87,8 @@ BENCHMARK(detectionCycle)->Arg(1024)->Unit(benchmark::kMillisecond);
 }  // namespace
 
 int main(int argc, char **argv) {
-    benchmark::Initialize(&argc, argv);
     FigureKeepingReporter reporter;
-    benchmark::RunSpecifiedBenchmarks(&reporter);
-    benchmark::Shutdown();
+    runBenchmarks(argc, argv, reporter);
     const RunFigures *small = reporter.find("detectionCycle/16");
     const RunFigures *large = reporter.find("detectionCycle/1024");
     if (small != nullptr && large != nullptr) {

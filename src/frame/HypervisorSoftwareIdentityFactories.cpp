@@ -50,9 +50,7 @@ public:
 
     CmpiStatus enumInstanceNames(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop) override {
         const OMC::MutexLock held(lock);
-        requireServedClass(cop, enumNamesOfOtherClass);
-        versions.gatherVersions();
-        for (const SystemVersionInfo *record : records()) {
+        for (const SystemVersionInfo *record : refreshedRecords(cop, enumNamesOfOtherClass)) {
             CmpiObjectPath path(cop.getNameSpace(), textOf(cop.getClassName()));
             path.setKey("InstanceID", CmpiData(makeInstanceId(*record)));
             rslt.returnData(path);
@@ -64,9 +62,7 @@ public:
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
         const OMC::MutexLock held(lock);
-        requireServedClass(cop, enumInstancesOfOtherClass);
-        versions.gatherVersions();
-        for (const SystemVersionInfo *record : records()) {
+        for (const SystemVersionInfo *record : refreshedRecords(cop, enumInstancesOfOtherClass)) {
             CmpiInstance instance(cop);
             instance.setPropertyFilter(properties, nullptr);
             Software::fillSoftwareIdentity(instance, *record, bootTimeMicros);
@@ -79,13 +75,12 @@ public:
     CmpiStatus getInstance(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                            const char **properties) override {
         const OMC::MutexLock held(lock);
-        requireServedClass(cop, getInstanceOfOtherClass);
-        versions.gatherVersions();
+        const std::vector<const SystemVersionInfo *> known = refreshedRecords(cop, getInstanceOfOtherClass);
         CmpiInstance instance(CmpiObjectPath(cop.getNameSpace(), hypervisorIdentityClass));
         instance.setPropertyFilter(properties, nullptr);
         const std::string instanceId = frame::keyText(cop, "InstanceID").value_or("");
         const SystemVersionInfo *found = nullptr;
-        for (const SystemVersionInfo *record : records()) {
+        for (const SystemVersionInfo *record : known) {
             if (instanceId == makeInstanceId(*record)) {
                 found = record;
                 break;
@@ -105,8 +100,13 @@ public:
     }
 
 private:
-    // The running image first, then the alternate one when it is known.
-    std::vector<const SystemVersionInfo *> records() const {
+    // Under the lock: refuses another class with its message, then refreshes
+    // the records; the running image first, then the alternate one when it
+    // is known.
+    std::vector<const SystemVersionInfo *> refreshedRecords(const CmpiObjectPath &cop,
+                                                            const char *messageForOtherClass) {
+        requireServedClass(cop, messageForOtherClass);
+        versions.gatherVersions();
         std::vector<const SystemVersionInfo *> known{&versions.running()};
         if (versions.altBootBank() != nullptr) known.push_back(versions.altBootBank());
         return known;
