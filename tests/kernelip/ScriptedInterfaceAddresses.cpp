@@ -8,19 +8,7 @@
 
 namespace kipdtest {
 
-InterfaceAddressList::InterfaceAddressList(const EntryList &entries) {
-    // The nodes link to each other, so they never move once built.
-    nodes.reserve(entries.size());
-    for (const Entry &entry : entries) {
-        ifaddrs &node = nodes.emplace_back();
-        node.ifa_name = names.emplace_back(entry.name).data();
-        node.ifa_addr = socketAddress(entry.family, entry.address);
-        node.ifa_netmask = socketAddress(entry.family, entry.netmask);
-        if (nodes.size() > 1) nodes[nodes.size() - 2].ifa_next = &node;
-    }
-}
-
-sockaddr *InterfaceAddressList::socketAddress(int family, const std::string &text) {
+sockaddr *ScriptedInterfaceAddresses::socketAddress(int family, const std::string &text) {
     if (text.empty()) return nullptr;
     sockaddr_storage &storage = socketAddresses.emplace_back();
     storage.ss_family = static_cast<sa_family_t>(family);
@@ -35,26 +23,27 @@ sockaddr *InterfaceAddressList::socketAddress(int family, const std::string &tex
 
 void ScriptedInterfaceAddresses::show(const std::vector<EntryList> &texts) {
     lists.clear();
-    for (const EntryList &list : texts) lists.push_back(std::make_unique<InterfaceAddressList>(list));
+    socketAddresses.clear();
+    names.clear();
     nextList = 0;
-}
-
-void ScriptedInterfaceAddresses::failReads(int error, int count, int after) {
-    failureError = error;
-    failuresLeft = count;
-    readsBeforeFailing = after;
+    for (const EntryList &text : texts) {
+        std::vector<ifaddrs> &nodes = lists.emplace_back(text.size());
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            nodes[i].ifa_name = names.emplace_back(text[i].name).data();
+            nodes[i].ifa_addr = socketAddress(text[i].family, text[i].address);
+            nodes[i].ifa_netmask = socketAddress(text[i].family, text[i].netmask);
+            nodes[i].ifa_next = i + 1 < text.size() ? &nodes[i + 1] : nullptr;
+        }
+    }
 }
 
 int ScriptedInterfaceAddresses::read(ifaddrs **list) {
-    ++reads;
-    if (readsBeforeFailing > 0) {
-        --readsBeforeFailing;
-    } else if (failuresLeft > 0) {
-        --failuresLeft;
+    if (readsBeforeFailure >= 0 && readsBeforeFailure-- == 0) {
         errno = failureError;
         return -1;
     }
-    *list = lists.empty() ? nullptr : lists[nextList++ % lists.size()]->head();
+    std::vector<ifaddrs> *nodes = lists.empty() ? nullptr : &lists[nextList++ % lists.size()];
+    *list = nodes == nullptr || nodes->empty() ? nullptr : nodes->data();
     // An empty list is a null one, which needs no release.
     if (*list != nullptr) ++handedOut;
     return 0;

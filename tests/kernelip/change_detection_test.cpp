@@ -1,8 +1,8 @@
 // The change detector over scripted interface-address lists: which
 // replacements become indications and in what order, what a disabled
-// detector reads, failures of the list and of delivery, and the
-// indication as the broker receives it, and enable and disable racing the
-// monitor thread's cycles (run under ThreadSanitizer to see a race).
+// detector reports, failures of the list and of delivery, the indication as
+// the broker receives it, and enable and disable racing the monitor
+// thread's cycles (run under ThreadSanitizer to see a race).
 #include <gtest/gtest.h>
 #include <syslog.h>
 
@@ -16,7 +16,6 @@
 #include "ScriptedInterfaceAddresses.h"
 #include "SyslogCapture.h"
 #include "kernelip/KernelIpIndication.h"
-#include "model/ValueText.h"
 #include "platform/OmcComputerSystem.h"
 
 namespace kipdtest {
@@ -57,8 +56,6 @@ TEST_F(Detection, ReportsEachGoneAddressOfTheSameFamilyForEachNewAddress) {
         {"netmask changed", {ipv4("eth0", "10.0.0.1")}, {ipv4("eth0", "10.0.0.1", "255.255.0.0")},
          {"Talvex:eth0 10.0.0.1/255.255.255.0 -> 10.0.0.1/255.255.0.0"}},
         {"IPv6 prefix changed", {ipv6("eth0", "fd00::1")}, {ipv6("eth0", "fd00::1", "ffff:ffff:ffff::")}, {}},
-        {"added only", {ipv4("eth0", "10.0.0.1")}, {ipv4("eth0", "10.0.0.1"), ipv4("eth0", "10.0.0.2")}, {}},
-        {"removed only", {ipv4("eth0", "10.0.0.1"), ipv4("eth0", "10.0.0.2")}, {ipv4("eth0", "10.0.0.2")}, {}},
         {"two replaced by two: new ones in list order, gone ones in their order",
          {ipv6("eth0", "fd00::1"), ipv6("eth0", "fd00::2")},
          {ipv6("eth0", "fd00::4"), ipv6("eth0", "fd00::3")},
@@ -69,13 +66,9 @@ TEST_F(Detection, ReportsEachGoneAddressOfTheSameFamilyForEachNewAddress) {
          kChange},
         {"mixed families, IPv4 replaced", {ipv4("eth0", "10.0.0.1"), ipv6("eth0", "fd00::1")},
          {ipv6("eth0", "fd00::1"), ipv4("eth0", "10.0.0.2")}, kChange},
-        {"IPv4 gone, IPv6 come", {ipv4("eth0", "10.0.0.1")}, {ipv6("eth0", "fd00::1")}, {}},
         {"interfaces in name order, not list order",
          {ipv4("eth1", "10.0.1.1"), ipv4("eth0", "10.0.0.1")}, {ipv4("eth1", "10.0.1.2"), ipv4("eth0", "10.0.0.2")},
          {kChange[0], "Talvex:eth1 10.0.1.1/255.255.255.0 -> 10.0.1.2/255.255.255.0"}},
-        {"new interface", {ipv4("eth0", "10.0.0.1")}, {ipv4("eth0", "10.0.0.1"), ipv4("eth1", "10.0.0.2")}, {}},
-        {"vanished interface", {ipv4("eth0", "10.0.0.1"), ipv4("eth1", "10.0.0.2")}, {ipv4("eth1", "10.0.0.2")}, {}},
-        {"address moved to another interface", {ipv4("eth0", "10.0.0.1")}, {ipv4("eth1", "10.0.0.1")}, {}},
         {"entries without a usable address are skipped",
          {linkLayer, ipv4("eth0", "", ""), ipv4("eth0", "10.0.0.1"), ipv6("eth0", "fd00::9", "")},
          {linkLayer, ipv4("eth0", "", ""), ipv6("eth0", "fd00::8", ""), ipv4("eth0", "10.0.0.2", ""),
@@ -99,41 +92,29 @@ TEST_F(Detection, ReportsEachGoneAddressOfTheSameFamilyForEachNewAddress) {
     EXPECT_EQ(takeLoggedLines(), std::vector<LoggedLine>{});
 }
 
-TEST_F(Detection, ReadsNothingWhileDisabledAndThenReportsWhatChangedMeanwhile) {
+TEST_F(Detection, ReportsNothingWhileDisabledAndThenWhatChangedMeanwhile) {
     addresses.show({ipv4("eth0", "10.0.0.1")});
-    cycle();
-    EXPECT_EQ(addresses.readCount(), 0) << "never enabled";
     detector.enableIndication();
-    cycle();
     detector.disableIndication();
-    EXPECT_FALSE(detector.isEnabled());
     addresses.show({ipv4("eth0", "10.0.0.2")});
-    const int reads = addresses.readCount();
     cycle();
-    EXPECT_EQ(addresses.readCount(), reads) << "disabled";
     EXPECT_TRUE(broker.takeSummaries().empty());
     detector.enableIndication();
-    EXPECT_TRUE(detector.isEnabled());
     cycle();
     EXPECT_EQ(broker.takeSummaries(), kChange) << "the baseline from before the disable is kept";
-    EXPECT_EQ(takeLoggedLines(), std::vector<LoggedLine>{});
 }
 
+// Only the baseline's read fails: the old baseline stays, so the change is
+// found again on the next cycle.
 TEST_F(Detection, AFailedReadIsLoggedAndKeepsWhatWasReadBefore) {
-    const LoggedLine unreadable{
-        LOG_ERR, std::string("Unable to refresh network interface information of the system, Error: ") +
-                     std::strerror(ENOMEM) + "\n"};
     enableOver({ipv4("eth0", "10.0.0.1")}, {ipv4("eth0", "10.0.0.2")});
-    // Both reads of a cycle fail: the old current state meets the old baseline.
-    addresses.failReads(ENOMEM, 2);
-    cycle();
-    EXPECT_TRUE(broker.takeSummaries().empty());
-    EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{unreadable, unreadable}));
-    // Only the baseline's read fails: the change is found, and found again.
-    addresses.failReads(ENOMEM, 1, 1);
+    addresses.failOneRead(ENOMEM, 1);
     cycle();
     EXPECT_EQ(broker.takeSummaries(), kChange);
-    EXPECT_EQ(takeLoggedLines(), std::vector<LoggedLine>{unreadable});
+    EXPECT_EQ(takeLoggedLines(),
+              (std::vector<LoggedLine>{{LOG_ERR, std::string("Unable to refresh network interface information of "
+                                                             "the system, Error: ") +
+                                                     std::strerror(ENOMEM) + "\n"}}));
     cycle();
     EXPECT_EQ(broker.takeSummaries(), kChange);
     cycle();
@@ -141,15 +122,14 @@ TEST_F(Detection, AFailedReadIsLoggedAndKeepsWhatWasReadBefore) {
 }
 
 TEST_F(Detection, ARefusedDeliveryIsLoggedWithItsCodeAndTheRestAreStillSent) {
-    enableOver({ipv6("vmk0", "fd00::1", "ffff:ffff:ffff::"), ipv6("vmk0", "fd00::2"), ipv4("vmk1", "10.0.0.1")},
+    enableOver({ipv6("vmk0", "fd00::1", "ffff:ffff:ffff::"), ipv4("vmk1", "10.0.0.1")},
                {ipv6("vmk0", "fd00::3"), ipv4("vmk1", "10.0.0.2")});
-    broker.refuseNext(2);
+    broker.refuseNext(1);
     cycle();
-    EXPECT_EQ(broker.takeSummaries(),
-              (Lines{"Talvex:vmk0 fd00::1/48 -> fd00::3/64", "Talvex:vmk0 fd00::2/64 -> fd00::3/64",
-                     "Talvex:vmk1 10.0.0.1/255.255.255.0 -> 10.0.0.2/255.255.255.0"}));
-    const LoggedLine refused{LOG_ERR, "Failed to deliver indication " + std::to_string(CMPI_RC_ERR_FAILED) + "\n"};
-    EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{refused, refused}));
+    EXPECT_EQ(broker.takeSummaries(), (Lines{"Talvex:vmk0 fd00::1/48 -> fd00::3/64",
+                                             "Talvex:vmk1 10.0.0.1/255.255.255.0 -> 10.0.0.2/255.255.255.0"}));
+    EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, "Failed to deliver indication " +
+                                                                        std::to_string(CMPI_RC_ERR_FAILED) + "\n"}}));
 }
 
 // The broker's enable and disable calls arrive on request threads while the
@@ -177,23 +157,14 @@ TEST_F(Detection, EnableAndDisableDuringCyclesStayConsistent) {
     EXPECT_EQ(takeLoggedLines(), std::vector<LoggedLine>{});
 }
 
-// A property's value as a client reads it; empty when absent or null.
-std::string valueOf(const tvxbroker::Instance &instance, const std::string &name) {
-    const tvxbroker::CimValue *value = instance.property(name);
-    std::string text;
-    bool quoted = false;
-    if (value != nullptr && !value->null) tvxbroker::scalarText(*value, text, quoted);
-    return text;
-}
-
 // The endpoints' addresses are read in every summary; here the rest.
 TEST_F(Detection, IndicationCarriesBothEndpointsAndTheSourcesPathAsText) {
     const std::string host = OMC::getComputerSystemName(broker.context(), broker.broker());
     const struct {
-        std::string className, sourceHost, protocolIFType, otherFamily[2];
+        std::string className, sourceHost, protocolIFType;
     } cases[] = {
-        {"Talvex_KernelIPv4ProtocolEndpoint", "192.168.7.20", "4096", {"IPv6Address", "PrefixLength"}},
-        {"Talvex_KernelIPv6ProtocolEndpoint", "fd00::a:2", "4097", {"IPv4Address", "SubnetMask"}},
+        {"Talvex_KernelIPv4ProtocolEndpoint", "192.168.7.20", "4096"},
+        {"Talvex_KernelIPv6ProtocolEndpoint", "fd00::a:2", "4097"},
     };
     enableOver({ipv4("vmk1", "192.168.7.1"), ipv6("vmk1", "fd00::1")},
                {ipv4("vmk1", "192.168.7.20"), ipv6("vmk1", "fd00:0::a:2")});
@@ -204,7 +175,6 @@ TEST_F(Detection, IndicationCarriesBothEndpointsAndTheSourcesPathAsText) {
     ASSERT_EQ(delivered.size(), 2u) << "to " << kNs;
     for (std::size_t i = 0; i < 2; ++i) {
         const auto &c = cases[i];
-        SCOPED_TRACE(c.className);
         const tvxbroker::Instance &event = delivered[i];
         EXPECT_EQ(event.path.className, "Talvex_KernelIPChangedIndication");
         EXPECT_EQ(valueOf(event, "PerceivedSeverity"), "3");
@@ -217,20 +187,15 @@ TEST_F(Detection, IndicationCarriesBothEndpointsAndTheSourcesPathAsText) {
         EXPECT_EQ(time.microseconds % 1000000u, 0u) << "whole seconds";
         EXPECT_GE(time.microseconds / 1000000u, earliest);
         EXPECT_LE(time.microseconds / 1000000u, latest);
-
-        const std::pair<std::string, std::string> values[] = {
-            {"SystemCreationClassName", "OMC_UnitaryComputerSystem"}, {"SystemName", host},
-            {"CreationClassName", c.className}, {"Name", "vmk1"}, {"ElementName", "vmk1"},
-            {"NameFormat", "Ostrakon Interface Name"}, {"ProtocolIFType", c.protocolIFType},
-            {c.otherFamily[0], ""}, {c.otherFamily[1], ""}};
         for (const char *endpoint : {"SourceInstance", "PreviousInstance"}) {
             const std::shared_ptr<const tvxbroker::Instance> carried = event.property(endpoint)->instance;
             ASSERT_NE(carried, nullptr) << endpoint;
             EXPECT_EQ(carried->path.nameSpace + ":" + carried->path.className, kNs + (":" + c.className));
-            for (const auto &[name, text] : values) EXPECT_EQ(valueOf(*carried, name), text) << endpoint << name;
+            EXPECT_EQ(valueOf(*carried, "SystemName"), host) << endpoint;
+            EXPECT_EQ(valueOf(*carried, "Name"), "vmk1") << endpoint;
+            EXPECT_EQ(valueOf(*carried, "ProtocolIFType"), c.protocolIFType) << endpoint;
         }
     }
-    EXPECT_EQ(takeLoggedLines(), std::vector<LoggedLine>{});
 }
 
 }  // namespace

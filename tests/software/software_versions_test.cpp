@@ -29,9 +29,8 @@ void serve(const std::string &profile) {
 // The number itself, or the third of three; anything else is -1.
 TEST(BootBank, BuildNumbers) {
     const std::pair<std::string, std::int32_t> cases[] = {
-        {"654321", 654321}, {"0.0.654321", 654321}, {"0", 0}, {"2147483647", 2147483647}, {"0654321", -1},
-        {"+654321", -1}, {"-654321", -1}, {"1.2", -1}, {"1.2.3.4", -1}, {"1..3", -1}, {"1.2.3x", -1},
-        {"abc", -1}, {"1 2", -1}, {"", -1}, {"2147483648", -1}, {std::string(100000, '1'), -1},
+        {"0.0.654321", 654321}, {"0", 0}, {"2147483647", 2147483647}, {"0654321", -1}, {"+654321", -1},
+        {"1.2", -1}, {"1.2.3.4", -1}, {"1..3", -1}, {"", -1}, {"2147483648", -1}, {std::string(100000, '1'), -1},
     };
     for (const auto &[text, build] : cases) EXPECT_EQ(buildNumberOf(text), build) << text.substr(0, 20);
 }
@@ -42,15 +41,12 @@ TEST(BootBank, EveryShapeOfTheBuildLine) {
         const char *version;  // null: the all-zero record
         std::int32_t build;
     } cases[] = {
-        {"build=5.1.0-0.0.654321\n", "5.1.0", 654321},
         {"build=5.1.0-654321  \t\r\n", "5.1.0", 654321},
         {"build=5.1.0-", "5.1.0", -1},
         {"build=" + std::string(40, '7') + "-42\n", "7777777777777777777777777777777", 42},
         {"build=5.1.0\n", nullptr, 0},
-        {"kernel=b.b00\n", nullptr, 0},
         {" build=5.1.0-1\nBUILD=5.1.0-2\n", nullptr, 0},
-        {"a=1\nbuild=5.1.0-11\nbuild=6.0.0-22\n", "5.1.0", 11},
-        {std::string(100000, 'x') + "\nbuild=5.1.0-3\n", "5.1.0", 3},
+        {std::string(100000, 'x') + "\nbuild=5.1.0-3\nbuild=6.0.0-22\n", "5.1.0", 3},
         {std::string("build=5.1\0.0-4\n", 15), nullptr, 0},
     };
     const BootBankFile file("");
@@ -84,39 +80,23 @@ protected:
 
 // Each failing request logs, and a failure after a success keeps none of
 // the earlier answer's texts.
-TEST_F(VersionSource, AFailingQueryLogsEachTimeAndLeavesOnlyTheDefaultsOnBothHostTypes) {
-    bootCfg.write("build=5.1.0-0.0.654321\n");
+TEST_F(VersionSource, AFailingQueryLogsEachTimeAndLeavesOnlyTheDefaults) {
     HypervisorVersions versions(bootCfg.path);
-    serve(R"({"hostType": "Corla", "systemVersion": {"productName": "P", "versionText": "6.7.8",
+    serve(R"({"hostType": "Corlai", "systemVersion": {"productName": "P", "versionText": "6.7.8",
               "infoText": "info", "releaseDate": "Mar 3 2020", "buildNumber": -1}})");
     versions.gatherVersions();
     EXPECT_EQ(makeInstanceId(versions.running()), "P 6.7.8 build-4294967295");
     EXPECT_STREQ(versions.running().releaseDateText, "Mar 3 2020");
     EXPECT_TRUE(takeLoggedLines().empty());
-    const struct {
-        const char *hostType;
-        const char *fault;
-        const char *product;
-        const char *logged;
-    } cases[] = {
-        // Only a Corlai host reads the boot bank, so it comes last.
-        {"Corla", R"({"call": "OskuserVersion_GetSystemVersion", "status": 5})", "Talvex Corla",
-         "Got error from OskuserVersion_GetSystemVersion (2): Not found\n"},
-        {"Corlai", R"({"call": "OskuserVersion_GetSystemVersion"})", "Talvex Corlai",
-         "Got error from OskuserVersion_GetSystemVersion (5): Failure injected by the host profile\n"},
-    };
-    for (const auto &c : cases) {
-        serve(std::string(R"({"hostType": ")") + c.hostType + R"(", "faults": [)" + c.fault + "]}");
-        for (int request = 0; request < 2; ++request) {
-            versions.gatherVersions();
-            EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, c.logged}})) << c.fault;
-        }
-        const SystemVersionInfo &running = versions.running();
-        EXPECT_EQ(makeInstanceId(running), std::string(c.product) + " 5.1.0 build-1483097") << c.fault;
-        EXPECT_STREQ(running.infoText, "version query failed");
-        EXPECT_STREQ(running.releaseDateText, "");
-        EXPECT_EQ(versions.altBootBank() != nullptr, std::string(c.hostType) == "Corlai") << c.hostType;
+    serve(R"({"hostType": "Corlai", "faults": [{"call": "OskuserVersion_GetSystemVersion"}]})");
+    for (int request = 0; request < 2; ++request) {
+        versions.gatherVersions();
+        EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, "Got error from OskuserVersion_GetSystemVersion "
+                                                                         "(5): Failure injected by the host profile\n"}}));
     }
+    EXPECT_EQ(makeInstanceId(versions.running()), "Talvex Corlai 5.1.0 build-1483097");
+    EXPECT_STREQ(versions.running().infoText, "version query failed");
+    EXPECT_STREQ(versions.running().releaseDateText, "");
 }
 
 TEST_F(VersionSource, TheBootBankIsReadEachTimeAndKeptWhenItCannotBeOpened) {
@@ -133,22 +113,15 @@ TEST_F(VersionSource, TheBootBankIsReadEachTimeAndKeptWhenItCannotBeOpened) {
     versions.gatherVersions();
     ASSERT_NE(versions.altBootBank(), nullptr);
     EXPECT_EQ(versions.altBootBank()->buildNumber, 1);
-    bootCfg.write("nothing\n");
-    versions.gatherVersions();
-    EXPECT_EQ(makeInstanceId(*versions.altBootBank()), "Alt Boot Bank:   build-0");
     EXPECT_TRUE(takeLoggedLines().empty());
 }
 
 TEST(ReleaseDate, MonthWordsAndDates) {
-    const struct {
-        const char *word;
-        int month;
-    } months[] = {
-        {"Jan", 0}, {"Feb", 1}, {"Mar", 2}, {"Apr", 3}, {"May", 4}, {"Jun", 5}, {"Jul", 6}, {"Aug", 7},
-        {"Sep", 8}, {"Oct", 9}, {"Nov", 10}, {"Dec", 11}, {"JUL", 6}, {"AuG", 7}, {"jul", 0}, {"dec", 0},
-        {"J", 0}, {"Ju", 0}, {"M", 0}, {"Max", 0}, {"A", 0}, {"Xyz", 0}, {"", 0},
+    const std::pair<const char *, int> months[] = {
+        {"Mar", 2}, {"Apr", 3}, {"May", 4}, {"Jun", 5}, {"JUL", 6}, {"AuG", 7}, {"Dec", 11},
+        {"jul", 0}, {"Ju", 0}, {"Max", 0}, {"A", 0}, {"", 0},
     };
-    for (const auto &m : months) EXPECT_EQ(monthOfWord(m.word), m.month) << m.word;
+    for (const auto &[word, month] : months) EXPECT_EQ(monthOfWord(word), month) << word;
 
     // A word that is no month counts as January.
     ASSERT_NE(releaseDateMicros("Jan 12 2012"), std::nullopt);
