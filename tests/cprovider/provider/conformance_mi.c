@@ -108,24 +108,21 @@ static CMPIInstance *sample_instance(const char *ns, const struct conf_sample *s
     return ci;
 }
 
-/* The one Conf_CPeer: references as keys and as properties. */
-static CMPIObjectPath *peer_path(const char *ns) {
+/* The one Conf_CPeer: references as keys, and as properties of its instance. */
+static CMPIObjectPath *peer_path(const char *ns, CMPIValue *ends) {
     CMPIObjectPath *op = broker->eft->newObjectPath(broker, ns, PEER_CLASS, NULL);
-    CMPIValue v;
-    v.ref = sample_path(ns, &conf_samples[0]);
-    ADD_KEY(op, "Antecedent", &v, CMPI_ref);
-    v.ref = sample_path(ns, &conf_samples[1]);
-    ADD_KEY(op, "Dependent", &v, CMPI_ref);
+    ends[0].ref = sample_path(ns, &conf_samples[0]);
+    ends[1].ref = sample_path(ns, &conf_samples[1]);
+    ADD_KEY(op, "Antecedent", &ends[0], CMPI_ref);
+    ADD_KEY(op, "Dependent", &ends[1], CMPI_ref);
     return op;
 }
 
 static CMPIInstance *peer_instance(const char *ns) {
-    CMPIInstance *ci = broker->eft->newInstance(broker, peer_path(ns), NULL);
-    CMPIValue v;
-    v.ref = sample_path(ns, &conf_samples[0]);
-    SET_PROPERTY(ci, "Antecedent", &v, CMPI_ref);
-    v.ref = sample_path(ns, &conf_samples[1]);
-    SET_PROPERTY(ci, "Dependent", &v, CMPI_ref);
+    CMPIValue ends[2];
+    CMPIInstance *ci = broker->eft->newInstance(broker, peer_path(ns, ends), NULL);
+    SET_PROPERTY(ci, "Antecedent", &ends[0], CMPI_ref);
+    SET_PROPERTY(ci, "Dependent", &ends[1], CMPI_ref);
     return ci;
 }
 
@@ -170,6 +167,7 @@ static const struct conf_sample *referenced_sample(const CMPIObjectPath *op, con
 /* Every object of the requested class, as instances or as paths. */
 static CMPIStatus return_all(const CMPIResult *rslt, const CMPIObjectPath *op, int instances) {
     CMPIStatus st = {CMPI_RC_OK, NULL};
+    CMPIValue ends[2];
     const char *ns = namespace_of(op);
     const int samples = serves(op, SAMPLE_CLASS);
     const int count = samples ? CONF_SAMPLE_COUNT : serves(op, PEER_CLASS); /* one peer or none */
@@ -178,7 +176,7 @@ static CMPIStatus return_all(const CMPIResult *rslt, const CMPIObjectPath *op, i
         if (instances) {
             st = rslt->ft->returnInstance(rslt, samples ? sample_instance(ns, &conf_samples[i]) : peer_instance(ns));
         } else {
-            st = rslt->ft->returnObjectPath(rslt, samples ? sample_path(ns, &conf_samples[i]) : peer_path(ns));
+            st = rslt->ft->returnObjectPath(rslt, samples ? sample_path(ns, &conf_samples[i]) : peer_path(ns, ends));
         }
     }
     if (st.rc == CMPI_RC_OK) st = rslt->ft->returnDone(rslt);
