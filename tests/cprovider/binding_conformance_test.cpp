@@ -1,10 +1,12 @@
-// The binding held to the broker the plain-C provider pins down: what it
-// reads of the C provider's objects through up-calls must be what the C
-// provider set.
+// The binding held to the broker the plain-C provider pins down: it reads
+// the C provider's objects through up-calls as the C provider set them, and
+// the same objects built through it, as the product's providers build
+// theirs, read back alike.
 #include <string>
 #include <utility>
 #include <vector>
 
+#include "CmpiArray.h"
 #include "CmpiBroker.h"
 #include "CmpiDateTime.h"
 #include "CmpiStatus.h"
@@ -75,26 +77,83 @@ CimValue readValue(const CmpiData &data) {
     }
 }
 
-TEST_F(ConformanceTest, BindingReadsWhatTheCProviderSet) {
-    const CmpiBroker binding(broker.cmpiBroker());
-    const CmpiContext ctx(broker.newContext(kNs));
-    const auto instancesOf = [&](const char *cls) {
-        std::vector<Instance> read;
-        const CmpiEnumeration found = binding.enumInstances(ctx, CmpiObjectPath(kNs, cls), nullptr);
-        while (found.hasNext()) read.push_back(readInstance(found.getNext()));
-        return read;
-    };
-    try {
-        expectSameInstances(instancesOf(kCProvider.sample), expectedSamples(kCProvider.sample));
-        expectSameInstances(instancesOf(kCProvider.peer), {expectedPeer(kCProvider)});
+// The conformance objects built through the binding, value for value as the
+// C provider builds them through the function tables.
+CmpiObjectPath samplePath(const conf_sample &sample) {
+    CmpiObjectPath path(kNs, kSampleClass);
+    path.setKey("Name", sample.name);
+    path.setKey("Label", sample.label);
+    path.setKey("Slot", sample.slot);
+    return path;
+}
 
-        std::vector<ObjectPath> names;
-        const CmpiEnumeration found = binding.enumInstanceNames(ctx, CmpiObjectPath(kNs, kCProvider.sample));
+CmpiInstance sampleInstance(const conf_sample &sample) {
+    CmpiInstance inst(samplePath(sample));
+    inst.setProperty("Name", sample.name);
+    inst.setProperty("Label", sample.label);
+    inst.setProperty("Slot", sample.slot);
+    inst.setProperty("Text", sample.text);
+    inst.setProperty("Made", sample.made);
+    inst.setProperty("Missing", CmpiData(static_cast<const char *>(nullptr)));
+    inst.setProperty("Enabled", sample.enabled != 0);
+    inst.setProperty("Count", sample.count);
+    inst.setProperty("Offset", sample.offset);
+    inst.setProperty("Ratio", sample.ratio);
+    inst.setProperty("Taken", CmpiDateTime(sample.taken, false));
+    inst.setProperty("Uptime", CmpiDateTime(sample.uptime, true));
+    CmpiArray names(CONF_NAMES_SIZE, CMPI_string);
+    names[0] = CONF_NAMES_0;
+    names[2] = CONF_NAMES_2;
+    inst.setProperty("Names", names);
+    CmpiArray counts(CONF_COUNTS_SIZE, CMPI_uint32);
+    counts[0] = CONF_COUNTS_0;
+    counts[3] = CONF_COUNTS_3;
+    inst.setProperty("Counts", counts);
+    inst.setProperty("Nothing", CmpiArray(0, CMPI_string));
+    CmpiObjectPath partPath(kNs, "Conf_Part");
+    partPath.setKey("Id", sample.part_id);
+    CmpiInstance part(partPath);
+    part.setProperty("Id", sample.part_id);
+    part.setProperty("Size", sample.part_size);
+    inst.setProperty("Part", part);
+    return inst;
+}
+
+CmpiInstance peerInstance() {
+    const CmpiObjectPath antecedent = samplePath(conf_samples[0]);
+    const CmpiObjectPath dependent = samplePath(conf_samples[1]);
+    CmpiObjectPath path(kNs, kPeerClass);
+    path.setKey("Antecedent", antecedent);
+    path.setKey("Dependent", dependent);
+    CmpiInstance inst(path);
+    inst.setProperty("Antecedent", antecedent);
+    inst.setProperty("Dependent", dependent);
+    return inst;
+}
+
+TEST_F(ConformanceTest, TheBindingReadsAndWritesEveryValueAsACProviderDoes) {
+    const CmpiBroker binding(broker.cmpiBroker());  // the binding makes its objects through it
+    const CmpiContext ctx(broker.newContext(kNs));
+    std::vector<Instance> read;
+    std::vector<ObjectPath> names;
+    std::vector<Instance> written;
+    try {
+        for (const char *cls : {kSampleClass, kPeerClass}) {
+            const CmpiEnumeration found = binding.enumInstances(ctx, CmpiObjectPath(kNs, cls), nullptr);
+            while (found.hasNext()) read.push_back(readInstance(found.getNext()));
+        }
+        const CmpiEnumeration found = binding.enumInstanceNames(ctx, CmpiObjectPath(kNs, kSampleClass));
         while (found.hasNext()) names.push_back(readPath(found.getNext()));
-        expectSamePaths(names, expectedSamples(kCProvider.sample));
+        for (const conf_sample &sample : conf_samples) written.push_back(readInstance(sampleInstance(sample)));
+        written.push_back(readInstance(peerInstance()));
     } catch (const CmpiStatus &status) {
         FAIL() << "the binding threw status " << status.rc() << ": " << (status.msg() ? status.msg() : "");
     }
+    const std::vector<Instance> expected = expectedObjects();
+    const std::vector<ObjectPath> expectedNames = {expected[0].path, expected[1].path};
+    EXPECT_EQ(describe(read), describe(expected));
+    EXPECT_EQ(describe(names), describe(expectedNames));
+    EXPECT_EQ(describe(written), describe(expected));
 }
 
 }  // namespace

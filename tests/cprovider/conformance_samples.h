@@ -1,16 +1,15 @@
 /*
- * What the conformance providers put into their objects: the plain-C
- * provider through the CMPI function tables, its twin through the C++
- * binding. Every consumer (both providers and the tests) reads this one
- * table, so a difference the tests find lies in how values crossed the
- * boundary, never in the data.
+ * What the conformance objects hold: the plain-C provider builds them
+ * through the CMPI function tables, the binding test through the binding.
+ * Both and the expectations read this one table, so a difference the tests
+ * find lies in how values crossed the boundary, never in the data.
  */
 #ifndef TVX_CONFORMANCE_SAMPLES_H
 #define TVX_CONFORMANCE_SAMPLES_H
 
 #include "cmpi/cmpidt.h"
 
-/* One Conf_Sample. Name is passed as CMPI_chars, Label and Made as
+/* One Conf_CSample. Name is passed as CMPI_chars, Label and Made as
  * CMPIStrings from the broker's newString; Missing is always null. */
 struct conf_sample {
     const char *name;
@@ -53,7 +52,7 @@ static const struct conf_sample conf_samples[CONF_SAMPLE_COUNT] = {
 #define CONF_COUNTS_0 7U
 #define CONF_COUNTS_3 4294967295U
 
-/* The one Conf_Peer ties the first sample (Antecedent) to the second
+/* The one Conf_CPeer ties the first sample (Antecedent) to the second
  * (Dependent). */
 
 #endif

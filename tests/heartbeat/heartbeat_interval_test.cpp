@@ -1,5 +1,6 @@
 // The heartbeat period read from configuration files the test writes: each
-// case gives its period and exactly the log lines prescribed for it.
+// case gives its period and exactly the log lines prescribed for it. The
+// rows are the edges of the reader: bounds, overflow, malformed lines.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -33,26 +34,17 @@ TEST(HeartbeatInterval, ConfigurationFilesGiveThePeriodAndLogAsPrescribed) {
         std::vector<LoggedLine> logged;
     } cases[] = {
         {"ColonAndBlank", "heartbeatInterval: 60\n", 60, {}},
-        {"EqualsAndTrailingComment", "heartbeatInterval=60 # once a minute\n", 60, {}},
-        {"AmongOtherSettings", "httpPort: 5988\n# heartbeat\n\nheartbeatInterval: 45\nhttpsPort: 5989\n", 45, {}},
         {"Minimum", "heartbeatInterval: 30\n", 30, {}},
         {"LargestThatFits", "heartbeatInterval: 2147483647\n", 2147483647, {}},
-        {"LeadingZeros", "heartbeatInterval: 000000000000000060\n", 60, {}},
-        {"MinusSignIsNotPartOfTheValue", "heartbeatInterval: -45\n", 45, {}},
-        {"KeyInsideAWord", "  myheartbeatIntervalX 40\n", 40, {}},
-        {"FirstDigitsBeforeTheKey", "x 50 heartbeatInterval 70\n", 50, {}},
         {"NoLineFeedAtTheEnd", "heartbeatInterval: 75", 75, {}},
         {"VeryLongLine", "heartbeatInterval:" + std::string(1 << 20, ' ') + "120\n", 120, {}},
         {"GarbageAroundTheKey", "\x01\xff\0heartbeatInterval\0=\x80 77\xfe\n"s, 77, {}},
         {"BelowMinimum", "heartbeatInterval: 29\n", kCurrent, belowMinimum("29")},
-        {"Zero", "heartbeatInterval: 0\n", kCurrent, belowMinimum("0")},
-        {"ElevenNines", "heartbeatInterval: 99999999999\n", kCurrent, belowMinimum("-1")},
         {"OneMoreThanFits", "heartbeatInterval: 2147483648\n", kCurrent, belowMinimum("-1")},
         {"EndlessDigits", "heartbeatInterval: " + std::string(100000, '9'), kCurrent, belowMinimum("-1")},
         {"CommentBeforeTheKey", "# heartbeatInterval: 60\nheartbeatInterval: 90\n", kCurrent, {}},
         {"CommentBeforeTheValue", "heartbeatInterval: # 60\n", kCurrent, {}},
         {"DigitsAtTheFirstCharacter", "60 heartbeatInterval\n", kCurrent, {}},
-        {"KeyInOtherCase", "HeartbeatInterval: 60\n", kCurrent, {}},
         {"NoKey", "httpPort: 5988\n", kCurrent, {}},
     };
     takeLoggedLines();

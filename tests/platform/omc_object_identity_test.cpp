@@ -50,16 +50,13 @@ TEST(OmcObjectIdentity, PathsNameTheSameObjectByClassAndKeyValues) {
         {"extra key", system({{"Name", "alpha"}, {"Rack", "1"}}), alpha, false},
         {"other key name", system({{"Label", "alpha"}}), alpha, false},
         {"integer widths", system({{"Id", CMPIUint16(7)}}), system({{"Id", CMPIUint64(7)}}), true},
-        {"negative integer widths", system({{"Id", CMPISint8(-5)}}), system({{"Id", CMPISint64(-5)}}), true},
         {"all bits set, signed and unsigned", system({{"Id", CMPISint64(-1)}}),
          system({{"Id", CMPIUint64(UINT64_MAX)}}), false},
         {"integer and its text", system({{"Id", CMPIUint32(7)}}), system({{"Id", "7"}}), false},
-        {"booleans", system({{"On", true}}), system({{"On", true}}), true},
         {"datetimes", system({{"At", CmpiDateTime(5, false)}}), system({{"At", CmpiDateTime(5, true)}}), false},
         {"null keys", system({{"Name", nullText}}), system({{"Name", nullText}}), true},
         {"null and text", system({{"Name", nullText}}), alpha, false},
         {"references to one object", link(alpha), link(alphaInNamespace), true},
-        {"references to two objects", link(alpha), link(system({{"Name", "beta"}})), false},
     };
     for (const Case &c : cases) {
         SCOPED_TRACE(c.what);

@@ -78,23 +78,16 @@ TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {
         Filters filters;
         std::vector<ObjectPath> answers;
     };
+    // The provider ignores every filter; the base applies them, the product's
+    // providers only narrowing further.
     const Case cases[] = {
         {{associatorNames}, alpha, {"", "", "", ""}, fromAlpha},
         {{associatorNames}, alpha, {"Test_SpareDevice", "", "", ""}, {disk1}},
-        {{associatorNames}, alpha, {"", "Test_Disk", "", ""}, {disk0, ghost, disk1}},
         {{associators}, alpha, {"", "Test_Disk", "", ""}, {disk0, disk1}},
         {{associatorNames}, alpha, {"", "", "antecedent", "DEPENDENT"}, fromAlpha},
         {{associatorNames}, alpha, {"", "", "Dependent", ""}, {}},
-        {{associatorNames}, alpha, {"", "", "", "Antecedent"}, {}},
-        {{associatorNames}, ObjectPath{"", "root/cimv2", "TEST_SYSTEM", {{"name", CimValue::makeString("alpha")}}},
-         {"", "", "", ""}, fromAlpha},
         {{associatorNames}, disk0, {"", "", "Dependent", "Antecedent"}, {alpha, system("beta")}},
-        {{associatorNames}, object("Test_Device", "disk0"), {"", "", "", ""}, {alpha, system("beta")}},
         {referencing, alpha, {"Test_SystemDevice", "", "ANTECEDENT", ""}, ofAlpha},
-        {referencing, alpha, {"Test_SpareDevice", "", "", ""}, {ofAlpha[3]}},
-        {referencing, alpha, {"", "", "Dependent", ""}, {}},
-        {referencing, disk0, {"", "", "Dependent", ""},
-         {ofAlpha[0], link("Test_HostedDevice", "beta", "Test_Disk", "disk0")}},
         {{associatorNames}, echo, echoed, {system("Test_HostedDevice Test_System Dependent Antecedent")}},
         // Only far ends that exist are fetched, whether the source exists or not.
         {{associators}, ghost, {"", "", "", ""}, {alpha}},
@@ -125,7 +118,6 @@ TEST_F(SimpleAssociation, AnswersKeepTheListedPropertiesTheKeysAndTheReferences)
         {associators, std::nullopt, {"DeviceID", "Model", "Size"}},
         {associators, PropertyList{{"Size"}}, {"DeviceID", "Size"}},
         {references, std::nullopt, association},
-        {references, PropertyList{{"note"}}, association},
         {references, PropertyList{std::vector<std::string>{}}, {"Antecedent", "Dependent"}},
     };
     for (const auto &c : cases) {
