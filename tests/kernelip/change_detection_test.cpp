@@ -10,11 +10,14 @@
 #include <cerrno>
 #include <cstring>
 #include <ctime>
+#include <memory>
 #include <thread>
 
 #include "DetectionBroker.h"
 #include "ScriptedInterfaceAddresses.h"
 #include "SyslogCapture.h"
+#include "kernelip/IPv4Address.h"
+#include "kernelip/IPv6Address.h"
 #include "kernelip/KernelIpIndication.h"
 #include "platform/OmcComputerSystem.h"
 
@@ -44,6 +47,32 @@ protected:
     ScriptedInterfaceAddresses addresses;
     TVX::KernelIpIndication detector{addresses};
 };
+
+// Equality, asked from either side: an IPv4 netmask counts, an IPv6 prefix
+// does not, and the families never meet.
+TEST(AddressEquality, HoldsBothWays) {
+    ScriptedInterfaceAddresses source;
+    source.show(EntryList{ipv4("a", "10.0.0.1"), ipv4("a", "10.0.0.1"), ipv4("a", "10.0.0.1", "255.255.0.0"),
+                          ipv6("a", "fe80::1"), ipv6("a", "fe80::1", "ffff::"), ipv6("a", "fe80::2")});
+    ifaddrs *list = nullptr;
+    ASSERT_EQ(source.read(&list), 0);
+    std::vector<std::unique_ptr<TVX::IAddress>> made;
+    for (const ifaddrs *entry = list; entry != nullptr; entry = entry->ifa_next) {
+        if (entry->ifa_addr->sa_family == AF_INET) made.push_back(std::make_unique<TVX::IPv4Address>(entry));
+        if (entry->ifa_addr->sa_family == AF_INET6) made.push_back(std::make_unique<TVX::IPv6Address>(entry));
+    }
+    source.release(list);
+    ASSERT_EQ(made.size(), 6u);
+    const struct {
+        int first, second;
+        bool equal;
+    } cases[] = {{0, 1, true}, {0, 2, false}, {3, 4, true}, {3, 5, false}, {0, 3, false}, {0, 0, true}};
+    for (const auto &c : cases) {
+        EXPECT_EQ(made[c.first]->isEqual(made[c.second].get()), c.equal) << c.first << " " << c.second;
+        EXPECT_EQ(made[c.second]->isEqual(made[c.first].get()), c.equal) << c.second << " " << c.first;
+    }
+    EXPECT_FALSE(made[0]->isEqual(nullptr));
+}
 
 TEST_F(Detection, ReportsEachGoneAddressOfTheSameFamilyForEachNewAddress) {
     const Entry linkLayer{"eth0", AF_PACKET, "bare", "bare"};
