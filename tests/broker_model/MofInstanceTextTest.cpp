@@ -12,7 +12,7 @@ ObjectPath pathOf(const std::string &cls, const std::string &key) {
 }
 
 // Unsigned integers, booleans and string arrays show in tvxcim's output tests.
-TEST(MofInstanceText, WritesEveryKindOfValue) {
+TEST(MofInstanceText, EscapesTextsAndWritesNullsRealsReferencesAndArrays) {
     Instance instance;
     instance.path = pathOf("TST_Thing", "line1\nline2 \"q\"");
     instance.properties = {

@@ -1,8 +1,8 @@
-// Values of every kind as tvxcim --json writes them, above all those a
-// careless rendering gets wrong: 64-bit integers past a double's precision,
-// reals JSON has no number for, NULL scalars, arrays and elements, embedded
-// instances, and bytes that are not UTF-8. Reference values and property
-// order show in the command output tests.
+// Values as tvxcim --json writes them where a careless rendering goes wrong:
+// 64-bit integers past a double's precision, reals JSON has no number for,
+// NULL scalars, arrays and elements, embedded instances, and bytes that are
+// not UTF-8. Reference values and property order show in the command output
+// tests.
 #include <gtest/gtest.h>
 
 #include <cstdint>
