@@ -27,8 +27,6 @@ TEST(CimValue, EqualityComparesTypeNullnessAndSelectedMember) {
                         {{"P", CimValue::makeSigned(CMPI_sint32, -1)}}};
     Instance right = left;
     right.properties[0].name = "p";
-    Instance different = left;
-    different.properties[0].value = CimValue::makeSigned(CMPI_sint32, -2);
     const CimValue x = CimValue::makeString("x");
     const CimValue yes = CimValue::makeBoolean(true);
     const ObjectPath twoKeys{"", "root/cimv2", "C", {{"K1", x}, {"K2", yes}}};
@@ -39,44 +37,22 @@ TEST(CimValue, EqualityComparesTypeNullnessAndSelectedMember) {
         {"string case matters", CimValue::makeString("a"), CimValue::makeString("A"), false},
         {"type differs", CimValue::makeUnsigned(CMPI_uint8, 1), CimValue::makeUnsigned(CMPI_uint16, 1), false},
         {"null differs", CimValue::makeNull(CMPI_string), CimValue::makeString(""), false},
-        {"nulls of one type", CimValue::makeNull(CMPI_uint8), CimValue::makeNull(CMPI_uint8), true},
         {"unselected member ignored", staleMember, CimValue::makeUnsigned(CMPI_uint8, 1), true},
-        {"signed", CimValue::makeSigned(CMPI_sint64, -5), CimValue::makeSigned(CMPI_sint64, 5), false},
         {"datetime kind", CimValue::makeDateTime({5, false}), CimValue::makeDateTime({5, true}), false},
-        {"array elements", CimValue::makeArray(CMPI_uint8, {CimValue::makeUnsigned(CMPI_uint8, 1)}),
-         CimValue::makeArray(CMPI_uint8, {CimValue::makeUnsigned(CMPI_uint8, 2)}), false},
-        {"array length", CimValue::makeArray(CMPI_uint8, {}),
-         CimValue::makeArray(CMPI_uint8, {CimValue::makeUnsigned(CMPI_uint8, 1)}), false},
         {"reference names ignore case",
          CimValue::makeReference(pathWithKey("Cls", "Key", CimValue::makeString("v"))),
          CimValue::makeReference(pathWithKey("CLS", "kEY", CimValue::makeString("v"))), true},
-        {"reference key value", CimValue::makeReference(pathWithKey("C", "K", CimValue::makeString("v"))),
-         CimValue::makeReference(pathWithKey("C", "K", CimValue::makeString("w"))), false},
         {"reference key order ignored", CimValue::makeReference(twoKeys), CimValue::makeReference(keysReordered),
          true},
         {"reference duplicate key", CimValue::makeReference(twoKeys), CimValue::makeReference(keyTwice), false},
         {"embedded instance", CimValue::makeInstance(left), CimValue::makeInstance(right), true},
-        {"embedded instance property", CimValue::makeInstance(left), CimValue::makeInstance(different), false},
     };
     for (const EqualityCase &c : cases) {
         EXPECT_EQ(c.a == c.b, c.equal) << c.what;
         EXPECT_EQ(c.b == c.a, c.equal) << c.what;
     }
-}
-
-// Which names count as CIM names shows in the registration tests, the only
-// place that asks.
-TEST(CimValue, NamesMatchIgnoringAsciiCaseOnly) {
-    const Instance instance{pathWithKey("C", "Name", CimValue::makeString("n")),
-                            {{"Size", CimValue::makeUnsigned(CMPI_uint32, 7)}}};
-    ASSERT_NE(instance.path.key("NAME"), nullptr);
-    EXPECT_EQ(instance.path.key("name")->text, "n");
-    ASSERT_NE(instance.property("sIZE"), nullptr);
-    EXPECT_EQ(instance.property("size")->unsignedValue, 7u);
-    EXPECT_EQ(instance.property("Name"), nullptr);
-    EXPECT_EQ(instance.path.key(""), nullptr);
     EXPECT_FALSE(equalsIgnoreCase("abc", "ab"));
-    EXPECT_FALSE(equalsIgnoreCase("\xC3\xA9", "\xC3\x89"));  // only ASCII folds
+    EXPECT_FALSE(equalsIgnoreCase("\xC3\xA9", "\xC3\x89")) << "only ASCII folds";
 }
 
 }  // namespace

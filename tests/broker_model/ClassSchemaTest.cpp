@@ -12,39 +12,34 @@
 namespace tvxbroker {
 namespace {
 
+// Real MOF files load in every broker test; here what they may vary in.
 const char *const sampleMof = R"MOF(#pragma locale ("en_US")
 // A comment with "quotes" and [brackets]
 /* a block comment
    class NotAClass { }; */
 Qualifier Key : boolean = false, Scope(property, reference), Flavor(DisableOverride, ToSubclass);
-Qualifier ValueMap : string[], Scope(property, method, parameter);
 
 [Abstract, Description ("The root. \"Quoted\" ] text, "
-    "concatenated; with { braces } and // no comment"), Version("2.0")]
+    "concatenated; with { braces } and // no comment")]
 class TST_Base {
-    [Key, MaxLen (256), Description ("id")] string InstanceID;
+    [Key, MaxLen (256)] string InstanceID;
     string Caption = "default; value";
     uint16 Codes[] = {1, 2, 3};
     [Key (false)] boolean NotKey;
     uint32 Reset([IN] boolean Force, [IN, OUT] string Messages[], [OUT] TST_Base REF Result);
 };
 
-[Association, Aggregation]
+[Association]
 class TST_Link {
     [Key] TST_Base REF Antecedent;
-    [Key, Description("x")] TST_Base REF Dependent;
+    [Key] TST_Base REF Dependent;
 };
 
 class TST_Derived : tst_base {
     string InstanceID;
     [Key] sint64 Serial;
     uint8 Bytes[4];
-    real64 Ref;
-    uint16 Port = 5988;
 };
-
-[Indication] class TST_Event { string Message; };
-class TST_Alert : TST_Event { uint8 Severity; };
 
 instance of TST_Base as $base {
     InstanceID = "a}b;c";
@@ -58,15 +53,10 @@ protected:
     ClassSchema schema;
 };
 
-TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
-    const ClassDecl *base = schema.find("tst_BASE");
-    ASSERT_NE(base, nullptr);
-    ASSERT_EQ(base->properties.size(), 4u);  // the method is not a property
-
-    const ClassDecl *derived = schema.find("TST_Derived");
-    ASSERT_NE(derived, nullptr);
-    EXPECT_EQ(derived->superclass, "TST_Base");
-
+TEST_F(ClassSchemaTest, RecordsPropertiesDefaultsAndKeysBaseFirst) {
+    ASSERT_NE(schema.find("tst_BASE"), nullptr);
+    EXPECT_EQ(schema.find("tst_BASE")->properties.size(), 4u) << "the method is not a property";
+    EXPECT_EQ(schema.find("TST_Derived")->superclass, "TST_Base");
     struct Expected {
         const char *cls, *prop;
         CMPIType type;
@@ -74,19 +64,13 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         bool key;
         CimValue defaultValue{};  // null unless the MOF gives one
     };
-    const CimValue caption = CimValue::makeString("default; value");
     const auto code = [](unsigned value) { return CimValue::makeUnsigned(CMPI_uint16, value); };
     const Expected expected[] = {
-        {"TST_Base", "instanceid", CMPI_string, "", true},
-        {"TST_Base", "Caption", CMPI_string, "", false, caption},
         {"TST_Base", "Codes", CMPI_uint16A, "", false, CimValue::makeArray(CMPI_uint16, {code(1), code(2), code(3)})},
         {"TST_Base", "NotKey", CMPI_boolean, "", false},
         {"TST_Link", "Dependent", CMPI_ref, "TST_Base", true},
-        {"TST_Derived", "Serial", CMPI_sint64, "", true},
         {"TST_Derived", "Bytes", CMPI_uint8A, "", false},
-        {"TST_Derived", "Ref", CMPI_real64, "", false},
-        {"TST_Derived", "Port", CMPI_uint16, "", false, code(5988)},
-        {"TST_Derived", "Caption", CMPI_string, "", false, caption},
+        {"TST_Derived", "caption", CMPI_string, "", false, CimValue::makeString("default; value")},
     };
     for (const Expected &e : expected) {
         const PropertyDecl *p = schema.findProperty(e.cls, e.prop);
@@ -96,37 +80,21 @@ TEST_F(ClassSchemaTest, RecordsClassesAndPropertyTypes) {
         EXPECT_EQ(p->key, e.key) << e.prop;
         EXPECT_EQ(p->defaultValue, e.defaultValue) << e.prop;
     }
-    EXPECT_EQ(schema.findProperty("TST_Base", "Serial"), nullptr);
-    EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
-}
-
-// Subclasses and associations on real classes show in the broker's dispatch
-// tests; here the spelling, inherited qualifiers and keys, and undeclared
-// names.
-TEST_F(ClassSchemaTest, HierarchyAndKeysComeBaseFirst) {
-    EXPECT_TRUE(schema.isA("tst_derived", "TST_BASE"));
-    EXPECT_FALSE(schema.isA("TST_Base", "TST_Derived"));
-    EXPECT_FALSE(schema.isA("Nope", "Nope"));
-    EXPECT_EQ(schema.selfAndSubclasses("tst_base"), (std::vector<std::string>{"TST_Base", "TST_Derived"}));
-    EXPECT_TRUE(schema.selfAndSubclasses("Nope").empty());
-    EXPECT_TRUE(schema.isAssociation("TST_Link"));
-    EXPECT_TRUE(schema.isIndication("tst_alert"));
-    EXPECT_FALSE(schema.isIndication("TST_Link"));
-    EXPECT_FALSE(schema.isIndication("Nope"));
     const std::vector<PropertyDecl> keys = schema.keysOf("TST_Derived");
     ASSERT_EQ(keys.size(), 2u);
-    EXPECT_EQ(keys[0].name, "InstanceID");
-    EXPECT_TRUE(keys[0].key);  // redeclared without Key, still a key
+    EXPECT_EQ(keys[0].name, "InstanceID") << "redeclared without Key, still a key";
     EXPECT_EQ(keys[1].name, "Serial");
-    EXPECT_EQ(schema.keysOf("TST_Link").size(), 2u);
-    EXPECT_TRUE(schema.keysOf("Nope").empty());
+    EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
+    EXPECT_FALSE(schema.isA("Nope", "Nope") || schema.isIndication("Nope"));
+    EXPECT_TRUE(schema.selfAndSubclasses("Nope").empty() && schema.keysOf("Nope").empty());
 }
 
 TEST_F(ClassSchemaTest, LoadsAccumulateAndFailedLoadsLeaveNothing) {
     schema.loadText("", "empty.mof");
     schema.loadText("\xEF\xBB\xBF// only a comment\n#pragma namespace(\"root/cimv2\")\n", "bom.mof");
-    schema.loadText("class TST_More : TST_Alert { };", "more.mof");
-    EXPECT_TRUE(schema.isIndication("TST_More"));
+    schema.loadText("[Indication] class TST_Event { };", "event.mof");
+    schema.loadText("class TST_Alert : TST_Event { };", "alert.mof");
+    EXPECT_TRUE(schema.isIndication("tst_alert"));
     EXPECT_THROW(schema.loadText("class TST_A {}; class TST_B : TST_Missing {};", "bad.mof"), std::runtime_error);
     EXPECT_EQ(schema.find("TST_A"), nullptr);
     schema.loadText("class TST_A {};", "again.mof");
@@ -142,24 +110,11 @@ std::string loadError(const std::string &text) {
 TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
     const std::pair<std::string, std::string> cases[] = {
         {"class A {\n/* never closed", "t.mof:2: unterminated comment"},
-        {"[Description(\"open\n)] class A {};", "t.mof:1: unterminated string"},
-        {"[D('x)] class A {};", "t.mof:1: unterminated character literal"},
         {"class A {\n string s;\n", "t.mof:3: expected a property or method declaration, found end of input"},
-        {"class A { string s }; ", "t.mof:1: expected ';', found '}'"},
-        {"class A { strin s; };", "t.mof:1: unknown type 'strin'"},
-        {"class A { string s; uint8 S; };", "t.mof:1: property S declared twice in class A"},
-        {"class A : B { };", "t.mof:1: superclass B of A is not declared"},
-        {"\n\nclass known { };", "t.mof:3: class known is already declared"},
-        {"[Key(] class A {};", "t.mof:1: expected ')', found ']'"},
         {"class A {\n [Description(\"x\"", "t.mof:2: '(' never closed"},
-        {"[Key class A {};", "t.mof:1: expected ',' or ']', found 'class'"},
-        {"instance A { };", "t.mof:1: expected 'of', found 'A'"},
-        {"Qualifier Key : boolean = false", "t.mof:1: expected ';', found end of input"},
-        {"#include \"x.mof\"", "t.mof:1: unknown directive '#include'"},
+        {"\n\nclass known { };", "t.mof:3: class known is already declared"},
         {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
         {"\x89PNG\r\n\x1a\n", "t.mof:1: unexpected byte 0x89"},
-        {"class A { } ;;", "t.mof:1: expected a class, instance or qualifier declaration, found ';'"},
-        {"class A {\n uint16 p = \"1\"; };", "t.mof:2: default value of p does not fit its type"},
         {"class A {\n uint16 p = 65536; };", "t.mof:2: default value 65536 of p is out of range for uint16"},
     };
     for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;
@@ -168,7 +123,6 @@ TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
 TEST(ClassSchemaErrors, FilesAreNamedInMessages) {
     ClassSchema schema;
     EXPECT_EQ(errorOf([&] { schema.loadFile("/"); }), "cannot read /");
-
     const std::string path = ::testing::TempDir() + "schema_test.mof";
     std::ofstream(path) << "class F {\n  uint99 x;\n};\n";
     EXPECT_EQ(errorOf([&] { schema.loadFile(path); }), path + ":2: unknown type 'uint99'");

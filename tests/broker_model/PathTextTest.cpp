@@ -1,6 +1,5 @@
 #include <gtest/gtest.h>
 
-#include <stdexcept>
 #include <string>
 
 #include "ErrorText.h"
@@ -22,7 +21,6 @@ class TST_Thing {
     [Key] datetime When;
     [Key] char16 Letter;
     [Key] TST_Other REF Other;
-    string Tags[];
 };
 class TST_Sub : TST_Thing { };
 )MOF";
@@ -35,13 +33,11 @@ protected:
 
 TEST_F(PathTextTest, CanonicalTextRoundTrips) {
     const std::string cases[] = {
-        "root/cimv2:TST_Other",
         "root/cimv2:TST_Other.K=\"\"",
         "root/cimv2:TST_Other.K=\"say \\\"hi\\\" C:\\\\dir,x=1\"",
         "root/cimv2:TST_Thing.Small=255,Delta=-32768,Big=18446744073709551615,Wide=-9223372036854775808",
         "root/cimv2:TST_Thing.Flag=FALSE,Ratio=0.1,Name=\"a\"",
         "root/cimv2:TST_Thing.When=\"20240101120000.000000+000\",Letter=\"\xC3\xA9\"",
-        "root/cimv2:TST_Thing.When=\"00000001020304.000005:000\",Letter=\"\\\"\"",
         "root/cimv2:TST_Sub.Other=\"root/interop:TST_Other.K=\\\"v \\\\\\\"q\\\\\\\"\\\"\",Name=NULL",
     };
     for (const std::string &text : cases) EXPECT_EQ(formatPath(parsePath(text, schema)), text);
@@ -58,50 +54,17 @@ TEST_F(PathTextTest, ValuesTakeTheDeclaredType) {
                                  {"Flag", CimValue::makeBoolean(true)},
                                  {"Other", CimValue::makeReference(other)},
                                  {"When", CimValue::makeDateTime(noonUtc)}}}));
-    // The spelling and order of names, which equality ignores.
-    EXPECT_EQ(formatPath(path),
-              "ns:TST_Sub.Small=7,Flag=TRUE,Other=\"root/cimv2:TST_Other.K=\\\"v\\\"\","
-              "When=\"20240101120000.000000+000\"");
-}
-
-TEST_F(PathTextTest, FormatShowsWhatParseCannotReadAndRejectsArrays) {
-    ObjectPath path{"", "", "TST_Other", {{"K", CimValue::makeString("x")}}};
-    EXPECT_EQ(formatPath(path), "TST_Other.K=\"x\"");
-    path.keys.push_back({"E", CimValue::makeInstance(Instance{path, {}})});
-    EXPECT_EQ(formatPath(path), "TST_Other.K=\"x\",E=\"TST_Other.K=\\\"x\\\"\"");
-    path.keys.push_back({"Tags", CimValue::makeArray(CMPI_string, {})});
-    EXPECT_THROW(formatPath(path), std::invalid_argument);
 }
 
 TEST_F(PathTextTest, ErrorsNameProblemAndPosition) {
     const std::pair<std::string, std::string> cases[] = {
         {"TST_Other.K=\"x\"", "missing ':' after the namespace at position 15"},
-        {":TST_Other", "empty namespace at position 0"},
-        {"ns:", "empty class name at position 3"},
-        {"ns:Nope.K=1", "unknown class Nope at position 3"},
-        {"ns:TST_Other.Z=\"x\"", "class TST_Other has no property Z at position 13"},
         {"ns:TST_Other.K=\"x", "unterminated quoted value at position 15"},
-        {"ns:TST_Other.K=\"x\\n\"", "invalid escape at position 17"},
-        {"ns:TST_Other.K", "missing '=' after key K at position 14"},
-        {"ns:TST_Other.K=\"x\"y", "unexpected character 'y' at position 18"},
-        {"ns:TST_Other.K=\"x\",", "expected a key name at position 19"},
-        {"ns:TST_Other K=1", "unexpected character ' ' at position 12"},
         {"ns:TST_Other.K=\"x\",k=\"y\"", "duplicate key k at position 19"},
-        {"ns:TST_Other.K=", "missing value of key K at position 15"},
-        {"ns:TST_Other.K=x", "value of K must be quoted at position 15"},
-        {"ns:TST_Thing.Small=\"1\"", "value of Small must not be quoted at position 19"},
         {"ns:TST_Thing.Small=256", "value 256 of Small is out of range for uint8 at position 19"},
         {"ns:TST_Thing.Small=-1", "value of Small is not an unsigned integer at position 19"},
         {"ns:TST_Thing.Big=18446744073709551616", "value of Big is not an unsigned integer at position 17"},
-        {"ns:TST_Thing.Delta=32768", "value 32768 of Delta is out of range for sint16 at position 19"},
-        {"ns:TST_Thing.Delta=-32769", "value -32769 of Delta is out of range for sint16 at position 19"},
-        {"ns:TST_Thing.Wide=+1", "value of Wide is not an integer at position 18"},
-        {"ns:TST_Thing.Flag=yes", "value of Flag is not TRUE or FALSE at position 18"},
-        {"ns:TST_Thing.Ratio=1.5x", "value of Ratio is not a real number at position 19"},
-        {"ns:TST_Thing.When=\"2024\"", "value of When is not a CIM datetime at position 18"},
-        {"ns:TST_Thing.Letter=\"ab\"", "value of Letter is not a single character at position 20"},
         {"ns:TST_Thing.Letter=\"\xC0\x80\"", "value of Letter is not a single character at position 20"},
-        {"ns:TST_Thing.Tags=\"x\"", "property Tags has a type that cannot appear in a path at position 18"},
         {"ns:TST_Thing.Other=\"ns:Nope\"",
          "invalid reference in Other (unknown class Nope at position 3) at position 19"},
         // Garbage that must end in an error, not a read past the end.

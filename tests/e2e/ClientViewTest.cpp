@@ -4,12 +4,10 @@
 #include <gtest/gtest.h>
 
 #include "ClientView.h"
-#include "model/PathText.h"
 
 namespace {
 
-using namespace tvxbroker;
-using consistency::canonicalText;
+using namespace consistency;
 
 class ClientViewTest : public testing::Test {
 protected:
@@ -26,11 +24,10 @@ class Test_Pair : Test_Base { [Key] uint32 Number; };
     ClassSchema schema;
 };
 
-const CimValue kSeven = CimValue::makeUnsigned(CMPI_uint32, 7);
-
 ObjectPath pair(const std::string &nameSpace, const std::string &cls, const std::string &nameKey,
-                const std::string &name, const CimValue &number = kSeven) {
-    return ObjectPath{"", nameSpace, cls, {{nameKey, CimValue::makeString(name)}, {"Number", number}}};
+                const std::string &name, std::uint64_t number = 7) {
+    return ObjectPath{"", nameSpace, cls,
+                      {{nameKey, CimValue::makeString(name)}, {"Number", CimValue::makeUnsigned(CMPI_uint32, number)}}};
 }
 
 TEST_F(ClientViewTest, SpellingKeyOrderAndHostDoNotMatterValuesDo) {
@@ -41,7 +38,7 @@ TEST_F(ClientViewTest, SpellingKeyOrderAndHostDoNotMatterValuesDo) {
     const std::pair<ObjectPath, bool> cases[] = {
         {respelled, true},
         {pair("root/cimv2", "Test_Pair", "Name", "A"), false},
-        {pair("root/cimv2", "Test_Pair", "Name", "a", CimValue::makeUnsigned(CMPI_uint32, 8)), false},
+        {pair("root/cimv2", "Test_Pair", "Name", "a", 8), false},
         {pair("root/other", "Test_Pair", "Name", "a"), false},
         {pair("root/cimv2", "Test_Base", "Name", "a"), false},
     };
@@ -55,7 +52,7 @@ TEST_F(ClientViewTest, SpellingKeyOrderAndHostDoNotMatterValuesDo) {
 }
 
 TEST_F(ClientViewTest, RolesIncludeInheritedReferencesOnce) {
-    const std::vector<PropertyDecl> roles = consistency::rolesOf("Test_NamedLink", schema);
+    const std::vector<PropertyDecl> roles = rolesOf("Test_NamedLink", schema);
     ASSERT_EQ(roles.size(), 2U);
     EXPECT_EQ(roles[0].name, "Right");
     EXPECT_EQ(roles[0].referenceClass, "Test_Pair");

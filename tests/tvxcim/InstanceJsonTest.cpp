@@ -1,8 +1,8 @@
-// Values of every kind as tvxcim --json writes them, above all those a
-// careless rendering gets wrong: 64-bit integers past a double's precision,
-// reals JSON has no number for, NULL scalars, arrays and elements, embedded
-// instances, and bytes that are not UTF-8. Reference values and property
-// order show in the command output tests.
+// Values as tvxcim --json writes them where a careless rendering goes wrong:
+// 64-bit integers past a double's precision, reals JSON has no number for,
+// NULL scalars, arrays and elements, embedded instances, and bytes that are
+// not UTF-8. Reference values and property order show in the command output
+// tests.
 #include <gtest/gtest.h>
 
 #include <cstdint>
@@ -17,18 +17,13 @@ using tvxcim::Json;
 
 TEST(InstanceJsonTest, WritesTypeAndValue) {
     const double nan = std::numeric_limits<double>::quiet_NaN();
-    const double infinity = std::numeric_limits<double>::infinity();
     const Instance event{ObjectPath{"", "", "Test_Event", {}}, {{"Sequence", CimValue::makeUnsigned(CMPI_uint32, 7)}}};
     const std::pair<CimValue, const char *> cases[] = {
         {CimValue::makeUnsigned(CMPI_uint64, UINT64_MAX), R"({"type":"uint64","value":"18446744073709551615"})"},
         {CimValue::makeSigned(CMPI_sint64, INT64_MIN), R"({"type":"sint64","value":"-9223372036854775808"})"},
-        {CimValue::makeUnsigned(CMPI_uint32, 4294967295U), R"({"type":"uint32","value":4294967295})"},
         {CimValue::makeReal(CMPI_real64, 0.1), R"({"type":"real64","value":0.1})"},
         {CimValue::makeReal(CMPI_real32, nan), R"({"type":"real32","value":"NaN"})"},
-        {CimValue::makeReal(CMPI_real64, -infinity), R"({"type":"real64","value":"-Infinity"})"},
         {CimValue::makeUnsigned(CMPI_char16, 0xE9), R"({"type":"char16","value":"\u00e9"})"},
-        {CimValue::makeDateTime(DateTime{86400000000ULL + 1, true}),
-         R"({"type":"datetime","value":"00000001000000.000001:000"})"},
         {CimValue::makeNull(CMPI_string), R"({"type":"string","value":null})"},
         {CimValue::makeNull(CMPI_uint64A), R"({"type":"uint64[]","value":null})"},
         {CimValue::makeArray(CMPI_uint64, {CimValue::makeUnsigned(CMPI_uint64, 1), CimValue::makeNull(CMPI_uint64)}),

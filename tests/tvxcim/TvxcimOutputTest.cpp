@@ -1,6 +1,5 @@
 // What each command prints for representative test provider instances, in
-// MOF and as JSON, the demo's sections in both forms, and what listen prints.
-#include <gmock/gmock.h>
+// MOF and as JSON, the demo's sections, and what listen prints.
 #include <gtest/gtest.h>
 
 #include <nlohmann/json.hpp>
@@ -10,33 +9,17 @@
 namespace {
 
 using namespace tvxcimtest;
-using testing::HasSubstr;
 using Json = nlohmann::ordered_json;
-
-const std::string kLinkAlpha =
-    R"(root/cimv2:Test_WidgetGadget.Owner="root/cimv2:Test_Widget.Name=\"alpha\"",)"
-    R"(Part="root/cimv2:Test_Gadget.Id=\"gadget-alpha\"")";
 
 // Which command asks the broker for what, and each answer in MOF; how each
 // value kind is written in MOF is the model's own test.
 TEST(TvxcimOutputTest, MofPrintsInstancesAsMofAndPathsAsText) {
     const std::pair<Args, std::string> cases[] = {
-        {{"--properties", "Tags", "gi", kAlpha},
-         "// " + std::string(kAlpha) +
-             "\ninstance of Test_Widget\n{\n    Name = \"alpha\";\n    Tags = {\"test\", \"alpha\"};\n};\n\n"},
-        {{"--properties", "Size,Enabled", "ei", "Test_SpecialWidget"},
-         "// root/cimv2:Test_SpecialWidget.Name=\"gamma\"\ninstance of Test_SpecialWidget\n{\n"
-         "    Name = \"gamma\";\n    Size = 3;\n    Enabled = TRUE;\n};\n\n"},
+        {{"--properties", "Tags,Size,Enabled", "gi", kAlpha},
+         "// " + std::string(kAlpha) + "\ninstance of Test_Widget\n{\n    Name = \"alpha\";\n    Size = 1;\n"
+         "    Tags = {\"test\", \"alpha\"};\n    Enabled = TRUE;\n};\n\n"},
         {{"ein", "root/cimv2:test_specialwidget"}, "root/cimv2:Test_SpecialWidget.Name=\"gamma\"\n"},
         {{"ain", kGadgetAlpha}, std::string(kAlpha) + "\n"},
-        {{"--properties", "WidgetName", "ai", kAlpha},
-         "// root/cimv2:Test_Gadget.Id=\"gadget-alpha\"\ninstance of Test_Gadget\n{\n"
-         "    Id = \"gadget-alpha\";\n    WidgetName = \"alpha\";\n};\n\n"},
-        {{"rin", kGadgetAlpha}, kLinkAlpha + "\n"},
-        {{"ri", kAlpha},
-         "// " + kLinkAlpha + "\ninstance of Test_WidgetGadget\n{\n"
-         "    Owner = \"root/cimv2:Test_Widget.Name=\\\"alpha\\\"\";\n"
-         "    Part = \"root/cimv2:Test_Gadget.Id=\\\"gadget-alpha\\\"\";\n};\n\n"},
         {{"--result-class", "Test_Widget", "ain", kAlpha}, ""},
     };
     for (const auto &[args, out] : cases) {
@@ -67,38 +50,28 @@ TEST(TvxcimOutputTest, JsonPrintsOneObjectPerLine) {
     ASSERT_EQ(run.status, 0) << run.err;
     const Json references = {{"Owner", {{"type", "reference"}, {"value", kAlphaPath}}},
                              {"Part", {{"type", "reference"}, {"value", kGadgetAlphaPath}}}};
-    const Json path = {
-        {"text", kLinkAlpha}, {"namespace", "root/cimv2"}, {"className", "Test_WidgetGadget"}, {"keys", references}};
+    const Json path = {{"text", R"(root/cimv2:Test_WidgetGadget.Owner="root/cimv2:Test_Widget.Name=\"alpha\"",)"
+                                 R"(Part="root/cimv2:Test_Gadget.Id=\"gadget-alpha\"")"},
+                        {"namespace", "root/cimv2"},
+                        {"className", "Test_WidgetGadget"},
+                        {"keys", references}};
     const Json instance = {{"className", "Test_WidgetGadget"}, {"path", path}, {"properties", references}};
     EXPECT_EQ(jsonLines(run.out), std::vector<Json>{instance});
 }
 
-// Which sections the demo shows, and in what order, is checked in the JSON
-// form below; the MOF headings, instances and first indication on the
-// built-in host are checked end to end (tests/e2e/check_demo.cmake).
-TEST(TvxcimDemoTest, MofShowsFailuresInPlace) {
-    const Outcome run = runOnTestProviders({"--seconds", "60", "demo"});
-    ASSERT_EQ(run.status, 0) << run.err;
-    EXPECT_THAT(run.out, HasSubstr("== ei Test_Missing\n   CMPI_RC_ERR_FAILED (1): provider MissingLib: "));
-}
-
+// The demo goes on past a section that fails, showing the failure in place
+// and, from the broker, once on stderr; the MOF form is checked end to end
+// on the built-in host (tests/e2e/check_demo.cmake).
 TEST(TvxcimDemoTest, JsonWritesEachSectionAsOneObject) {
     const Outcome run = runOnTestProviders({"--json", "--seconds", "60", "demo"});
     ASSERT_EQ(run.status, 0) << run.err;
-    // Failures shown in place in the output, and by the broker once each on stderr.
     EXPECT_EQ(lines(run.err).size(), 4U) << run.err;
     const std::vector<Json> sections = jsonLines(run.out);
     ASSERT_EQ(sections.size(), 14U);
-    EXPECT_EQ(sections[0]["section"], "ei");
-    EXPECT_EQ(sections[0]["instances"].size(), 3U);
     EXPECT_EQ(sections[6]["className"], "Test_Missing");
     EXPECT_EQ(sections[6]["error"]["rcName"], "CMPI_RC_ERR_FAILED");
-    EXPECT_THAT(sections[6]["error"]["message"].get<std::string>(), HasSubstr("libtvxnosuchlibrary.so"));
     EXPECT_EQ(sections[10]["names"], Json::array({kGadgetAlphaPath})) << "ain of widget alpha";
-    const Json &indication = sections[13];
-    EXPECT_EQ(indication["section"], "first indication");
-    EXPECT_EQ(indication["indication"]["className"], "Test_Event");
-    EXPECT_EQ(indication["indication"]["properties"]["Sequence"], Json::parse(R"({"type":"uint32","value":0})"));
+    EXPECT_EQ(sections[13]["indication"]["properties"]["Sequence"], Json::parse(R"({"type":"uint32","value":0})"));
 }
 
 // Test_Event arrives every few milliseconds once enabled: every indication
