@@ -176,9 +176,4 @@ BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
     return config;
 }
 
-BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs, const char *registrationFile,
-                              const std::vector<std::string> &mofFiles) {
-    return loadBrokerConfig(providerDirs, std::vector<std::string>{registrationFile}, mofFiles);
-}
-
 }  // namespace tvxbroker

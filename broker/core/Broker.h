@@ -134,8 +134,4 @@ BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs,
                               const std::vector<std::string> &registrationFiles,
                               const std::vector<std::string> &mofFiles);
 
-// The same for a single registration file.
-BrokerConfig loadBrokerConfig(const std::vector<std::string> &providerDirs, const char *registrationFile,
-                              const std::vector<std::string> &mofFiles);
-
 }  // namespace tvxbroker

@@ -60,7 +60,7 @@ inline std::uint64_t unsignedOf(const Instance &inst, const char *property) {
 class BrokerTest : public testing::Test {
 protected:
     static BrokerConfig testConfig() {
-        return loadBrokerConfig({TVX_TESTPROVIDER_DIR}, TVX_TESTPROVIDER_REG, {TVX_TESTPROVIDER_MOF});
+        return loadBrokerConfig({TVX_TESTPROVIDER_DIR}, {TVX_TESTPROVIDER_REG}, {TVX_TESTPROVIDER_MOF});
     }
 
     EventSink sink;  // declared first: it must outlive every delivery the broker makes

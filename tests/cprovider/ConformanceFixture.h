@@ -43,7 +43,7 @@ std::string describe(const std::vector<Object> &objects) {
 
 class ConformanceTest : public testing::Test {
 protected:
-    Broker broker{loadBrokerConfig({TVX_CPROVIDER_DIR}, TVX_CONFORMANCE_REG, {TVX_CONFORMANCE_MOF})};
+    Broker broker{loadBrokerConfig({TVX_CPROVIDER_DIR}, {TVX_CONFORMANCE_REG}, {TVX_CONFORMANCE_MOF})};
 };
 
 }  // namespace conformance

@@ -25,7 +25,7 @@ CmpiObjectPath system(const Keys &keys) { return path(nullptr, "Test_System", ke
 
 TEST(OmcObjectIdentity, PathsNameTheSameObjectByClassAndKeyValues) {
     // The broker knows the class hierarchy; the binding creates its objects through it.
-    tvxbroker::Broker broker{tvxbroker::loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, TVX_OMCTESTPROVIDER_REG,
+    tvxbroker::Broker broker{tvxbroker::loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, {TVX_OMCTESTPROVIDER_REG},
                                                          {TVX_OMCTESTPROVIDER_MOF})};
     const CmpiBroker binding{broker.cmpiBroker()};
     const CmpiObjectPath alpha = system({{"Name", "alpha"}});

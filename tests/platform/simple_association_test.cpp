@@ -55,7 +55,7 @@ protected:
         return broker.referenceNames(source, f[0], f[2]);
     }
 
-    Broker broker{loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, TVX_OMCTESTPROVIDER_REG, {TVX_OMCTESTPROVIDER_MOF})};
+    Broker broker{loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, {TVX_OMCTESTPROVIDER_REG}, {TVX_OMCTESTPROVIDER_MOF})};
 };
 
 TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {

@@ -121,7 +121,7 @@ TEST_F(InstalledSoftware, TraversalsFromBothEnds) {
 // Without a software identity provider the up-call enumeration is empty,
 // and then the association answers nothing at all, not even its end.
 TEST(InstalledSoftwareAlone, NothingAndNoEndWithoutSoftware) {
-    BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR}, TVX_PROVIDER_REG, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
+    BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR}, {TVX_PROVIDER_REG}, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
     std::vector<ProviderRegistration> &registrations = config.registrations;
     registrations.erase(std::remove_if(registrations.begin(), registrations.end(),
                                        [](const ProviderRegistration &registration) {
