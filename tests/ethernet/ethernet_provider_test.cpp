@@ -1,6 +1,6 @@
 // The Ethernet port provider as a client sees it through the broker: its
-// failure statuses, the port, identity and association instances built from
-// the inventory, and lookups by key.
+// failure statuses, the values a formatting fault would change, the property
+// filter, and lookups by names other than its own.
 #include <gmock/gmock.h>
 
 #include "EthernetBroker.h"
@@ -15,16 +15,12 @@ struct FailureCase {
     const char *message;  // null: none expected
 };
 
+// The code and message, and nothing returned before or after the error.
 void expectFailures(const std::vector<FailureCase> &cases) {
     for (const FailureCase &c : cases) {
         EXPECT_EQ(c.response.rc, c.rc) << c.what;
-        if (c.message != nullptr) {
-            EXPECT_EQ(c.response.message.value_or("<none>"), c.message) << c.what;
-        } else {
-            EXPECT_FALSE(c.response.message.has_value()) << c.what << ": " << *c.response.message;
-        }
-        EXPECT_TRUE(c.response.instances.empty() && c.response.paths.empty()) << c.what;
-        EXPECT_FALSE(c.response.done) << c.what;
+        EXPECT_EQ(c.response.message.value_or("<none>"), c.message ? c.message : "<none>") << c.what;
+        EXPECT_TRUE(c.response.instances.empty() && c.response.paths.empty() && !c.response.done) << c.what;
     }
 }
 
@@ -67,8 +63,6 @@ TEST_F(EthernetBroker, EveryFailureHasItsCodeAndMessage) {
     const char *failed = "Failed to get pnics information";
     expectFailures({
         {"ein port", b.enumInstanceNames(classPath("Talvex_EthernetPort")), CMPI_RC_ERR_FAILED, failed},
-        {"ei driver", b.enumInstances(classPath("Talvex_EPDriverSoftwareIdentity"), std::nullopt), CMPI_RC_ERR_FAILED,
-         failed},
         {"gi port nic0", b.getInstance(portPath("nic0"), std::nullopt), CMPI_RC_ERR_FAILED, failed},
     });
 }
@@ -98,44 +92,30 @@ TEST_F(EthernetBroker, PortValuesAsClientsReadThem) {
     } cases[] = {
         {0, "PermanentAddress", "\"021B210A0B0C\""},
         {0, "NetworkAddresses", "{\"021B210A0B0C\"}"},
-        {1, "PermanentAddress", "\"D094661A2B3D\""},
         {0, "Speed", "10000000000"},
         {0, "OtherIdentifyingInfo", "{\"vmk-nic0\", \"0x16\", \"0x2\", \"0x1\", \"0x  15\", \"0x10fb\"}"},
         {0, "Capabilities", "{5}"},
         {0, "EnabledCapabilities", "{0}"},
         {0, "ActiveMaximumTransmissionUnit", "9000"},
         {0, "EnabledState", "2"},
-        {0, "OperationalStatus", "{2}"},
         {0, "FullDuplex", "TRUE"},
-        {1, "EnabledState", "3"},
         {1, "OperationalStatus", "{10}"},
         {1, "FullDuplex", "FALSE"},
     };
     for (const auto &c : cases) EXPECT_EQ(nics[c.nic].at(c.property), c.literal) << "nic" << c.nic << " " << c.property;
 }
 
-TEST_F(EthernetBroker, IdentitiesAndElementsOfEachAdapter) {
+// The demo shows the version texts; here the firmware text cut to its
+// record field before it is formatted, and the elements' status array.
+TEST_F(EthernetBroker, FirmwareVersionKeepsItsFieldAndElementsTheirStatus) {
     serve(twoAdapterProfile());
-    const struct {
-        const char *cls, *elementName, *version;  // of nic0
-    } cases[] = {
-        {"Talvex_EPDriverSoftwareIdentity", "\"netdrv driver \"", "\"netdrv driver 1.2.3\""},
-        {"Talvex_EPFirmwareSoftwareIdentity", "\"netdrv device firmware \"",
-         "\"netdrv device firmware fw-9.0.0-with-a-text-wider-than\""},  // 31 characters kept
-    };
-    for (const auto &c : cases) {
-        const Response response = broker->enumInstances(classPath(c.cls), std::nullopt);
-        ASSERT_EQ(response.instances.size(), 2u) << c.cls;
-        const auto found = literals(response.instances[0]);
-        EXPECT_EQ(found.at("ElementName"), c.elementName);
-        EXPECT_EQ(found.at("VersionString"), c.version);
-    }
+    const Response firmware = broker->enumInstances(classPath("Talvex_EPFirmwareSoftwareIdentity"), std::nullopt);
+    ASSERT_EQ(firmware.instances.size(), 2u);
+    EXPECT_EQ(literals(firmware.instances[0]).at("VersionString"),
+              "\"netdrv device firmware fw-9.0.0-with-a-text-wider-than\"");  // 31 characters kept
     const Response elements =
         broker->enumInstances(classPath("Talvex_EPFirmwareElementSoftwareIdentity"), std::nullopt);
     ASSERT_EQ(elements.instances.size(), 2u);
-    EXPECT_EQ(referenceText(elements.instances[1], "Dependent"), formatPath(portPath("nic1")));
-    EXPECT_EQ(referenceText(elements.instances[1], "Antecedent"),
-              "root/cimv2:Talvex_EPFirmwareSoftwareIdentity.InstanceID=\"Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1\"");
     EXPECT_EQ(literals(elements.instances[1]).at("ElementSoftwareStatus"), "{2}");
 }
 
@@ -146,10 +126,10 @@ TEST_F(EthernetBroker, PropertyListFiltersPortsOnly) {
     const PropertyList speedOnly = std::vector<std::string>{"Speed"};
     const Response ports = broker->enumInstances(classPath("Talvex_EthernetPort"), speedOnly);
     ASSERT_EQ(ports.instances.size(), 2u);
+    using testing::Key;
     EXPECT_THAT(literals(ports.instances[0]),
-                testing::UnorderedElementsAre(testing::Key("Speed"), testing::Key("DeviceID"), testing::Key("EnabledState"),
-                                              testing::Key("RequestedState"), testing::Key("EnabledDefault"),
-                                              testing::Key("TransitioningToState")));
+                testing::UnorderedElementsAre(Key("Speed"), Key("DeviceID"), Key("EnabledState"), Key("RequestedState"),
+                                              Key("EnabledDefault"), Key("TransitioningToState")));
     const Response drivers = broker->enumInstances(classPath("Talvex_EPDriverSoftwareIdentity"), speedOnly);
     ASSERT_EQ(drivers.instances.size(), 2u);
     EXPECT_EQ(literals(drivers.instances[0]).size(), 4u);  // IsEntity is a class default
@@ -165,8 +145,8 @@ TEST_F(EthernetBroker, LookupsMatchAdapterNamesWithoutRegardToCase) {
         const char *key, *found;
     } cases[] = {
         {"port by upper-case name", portPath("NIC0"), "DeviceID", "nic0"},
-        {"class in other case", ObjectPath{"", kNs, "TALVEX_ethernetport", {{"DeviceID", CimValue::makeString("nic1")}}},
-         "DeviceID", "nic1"},
+        {"class in other case",
+         ObjectPath{"", kNs, "TALVEX_ethernetport", {{"DeviceID", CimValue::makeString("nic1")}}}, "DeviceID", "nic1"},
         {"whatever precedes the last colon", identityPath("Talvex_EPFirmwareSoftwareIdentity", "x:NIC1"), "InstanceID",
          "Talvex:Talvex_EPFirmwareSoftwareIdentity:nic1"},
         {"InstanceID without colon", identityPath("Talvex_EPDriverSoftwareIdentity", "nic0"), "InstanceID",

@@ -102,7 +102,6 @@ TEST_F(PnicInventory, EveryFaultEndsTheWalkAsItShould) {
         {R"({"call": "PRB_GetInstanceListAlloc", "node": 70})", 1, {}},
         {R"({"call": "PRB_ParamListGetString", "index": 1})", 1, {"vmnic0"}},
         {R"({"call": "PRB_ParamListCreate", "nth": 2})", 0, {"vmnic0"}},
-        {R"({"call": "PRB_ParamListCreate", "nth": 1})", 0, {}},
         {R"({"call": "PRB_ParamListAddString", "text": "vmnic2"})", 1, {"vmnic0", "vmnic1"}},
         {R"({"call": "PRB_Get", "node": 74, "instance": "vmnic1"})", 1, {"vmnic0"}},
         {R"({"call": "PRB_Get", "node": 72, "instance": "vmnic2"})", 1, {"vmnic0", "vmnic1"}},
@@ -124,7 +123,8 @@ TEST_F(PnicInventory, ServiceConsoleAsksTheDriverThroughASocket) {
         {"highspeed", reply(0, PORT_TP, 1000, 1)},  // only the low speed bits count
         {twentyChars.substr(0, 15), reply(0, PORT_TP, 10000)},
     };
-    const Inventory taken = take(profile("Corla", {"tp1000", "fibre1000", "fibre2500", "highspeed", "silent", twentyChars}));
+    const Inventory taken =
+        take(profile("Corla", {"tp1000", "fibre1000", "fibre2500", "highspeed", "silent", twentyChars}));
     ASSERT_EQ(taken.result, 0u);
     const struct {
         uint32_t portType;

@@ -10,7 +10,7 @@ namespace {
 void walkAdapters() {
     char area[21];
     if (PRB_CheckSig(area, sizeof area, nullptr) != 0) return;
-    for (const std::string &name : servedAdapterNames()) {
+    for (const std::string &name : adapterNames()) {
         Bytes mtu(4), record(1252);
         readNode(74, {name}, mtu);
         readNode(72, {name}, record);
@@ -18,7 +18,7 @@ void walkAdapters() {
     HostType_OSIsOSK();
 }
 
-class HostSimConcurrency : public HostSimTest {};
+using HostSimConcurrency = HostSimTest;
 
 TEST_F(HostSimConcurrency, CallsFromManyThreadsWhileProfilesChange) {
     const std::string profiles[] = {

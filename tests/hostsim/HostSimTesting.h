@@ -36,20 +36,17 @@ inline List listOf(const std::vector<Param> &params) {
     return list;
 }
 
-inline List instanceList(int node, int *status = nullptr) {
+// The instance list of `node` under a parent list holding `parent` (none when empty).
+inline List instanceList(int node, const std::vector<Param> &parent = {}, int *status = nullptr) {
+    const List parentList = parent.empty() ? List() : listOf(parent);
     PRB_ParamList *list = nullptr;
-    const int result = PRB_GetInstanceListAlloc(node, nullptr, &list);
+    const int result = PRB_GetInstanceListAlloc(node, parentList.get(), &list);
     if (status != nullptr) *status = result;
     return List(list);
 }
 
-// The texts of the instance list of `node` under a parent list holding
-// `parent` (none when empty); no names when the list cannot be had.
 inline std::vector<std::string> listedNames(int node, const std::vector<Param> &parent = {}) {
-    const List parentList = parent.empty() ? List() : listOf(parent);
-    PRB_ParamList *listed = nullptr;
-    PRB_GetInstanceListAlloc(node, parentList.get(), &listed);
-    const List list(listed);
+    const List list = instanceList(node, parent);
     std::vector<std::string> names;
     for (int i = 0; i < PRB_ParamListUsedCount(list.get()); ++i) {
         char *name = nullptr;
@@ -59,22 +56,16 @@ inline std::vector<std::string> listedNames(int node, const std::vector<Param> &
     return names;
 }
 
-inline std::vector<std::string> servedAdapterNames() {
-    return listedNames(70);
-}
+inline std::vector<std::string> adapterNames() { return listedNames(70); }
 
-// PRB_Get of `node` for a list of `params` into `buffer`.
 inline int readNode(int node, const std::vector<Param> &params, Bytes &buffer) {
     const List list = listOf(params);
     return PRB_Get(node, list.get(), buffer.data(), int(buffer.size()));
 }
 
 // A "Corlai" host. Vectors, since a braced single json would not become an array.
-inline nlohmann::json host(const std::vector<nlohmann::json> &adapters, const std::vector<nlohmann::json> &faults = {},
-                           const nlohmann::json &processors = nullptr) {
-    nlohmann::json profile = {{"hostType", "Corlai"}, {"adapters", adapters}, {"faults", faults}};
-    if (!processors.is_null()) profile["processors"] = processors;
-    return profile;
+inline nlohmann::json host(const std::vector<nlohmann::json> &adapters, const std::vector<nlohmann::json> &faults = {}) {
+    return {{"hostType", "Corlai"}, {"adapters", adapters}, {"faults", faults}};
 }
 
 // The loader's error, empty when the profile was loaded.

@@ -30,15 +30,12 @@ TEST(CpuidRecord, GivesTheVendorAndEachFeatureFromItsOwnRegister) {
     } cases[] = {
         {"Intel VMX among other bits", "GenuineIntel", 4, 0x00010800, 0x000000E0, 0, 0, 2, 0, 1, 0, 0, "4"},
         {"Intel every bit but VMX", "GenuineIntel", 0, 0, 0xFFFFFFDF, 0xFFFFFFFF, 0, 2, 0, 0, 0, 0, "0"},
-        {"Intel long mode alone", "GenuineIntel", 1, 0, 0, 0, lm, 2, 0, 0, 0, 1, "1"},
-        {"Intel no-execute alone", "GenuineIntel", 1, 0, 0, 0, nx, 2, 0, 0, 1, 0, "1"},
-        {"Intel brand index is the low byte", "GenuineIntel", 255, 0x0001080F, 0, 0, ~0u, 2, 15, 0, 1, 1, "255"},
+        {"Intel no-execute alone", "GenuineIntel", 255, 0, 0, 0, nx, 2, 0, 0, 1, 0, "255"},
         {"AMD SVM in the extended leaf", "AuthenticAMD", 2, 0x000000FF, 0, 0x00000004, nx | lm, 3, 255, 1, 1, 1, "2"},
         {"AMD ignores leaf 1 VMX", "AuthenticAMD", 2, 0, 0xFFFFFFFF, 0xFFFFFFFB, 0, 3, 0, 0, 0, 0, "2"},
         {"Intel ignores the extended SVM bit", "GenuineIntel", 9, 0, 0, 0x00000004, 0, 2, 0, 0, 0, 0, "9"},
         {"other vendor decodes nothing", "CentaurHauls", 3, 0x000000FF, ~0u, ~0u, ~0u, 1, 0, 0, 0, 0, "3"},
         {"vendor words in the wrong registers", "GenuntelineI", 0, 0, ~0u, 0, 0, 1, 0, 0, 0, 0, "0"},
-        {"lower-case vendor is another", "genuineintel", 0, 0, ~0u, 0, 0, 1, 0, 0, 0, 0, "0"},
     };
     for (const auto &c : cases) {
         // Laid out as the kernel does: EBX at 48, ECX at 52, EDX at 56; bytes
@@ -74,17 +71,12 @@ TEST(HostSettings, PolicyNamesThreadWordAndModelText) {
         uint8_t management, dynamic, hyperThreading;
         const char *shown;
     } cases[] = {
-        {"off", 0, "Xeon\tGold", 0, 0, 0, "Xeon Gold"},
-        {"OFF", 1, "Opteron\x7F" "6174", 0, 0, 1, "Opteron 6174"},
+        {"OFF", 0, "Xeon\tGold\x7F", 0, 0, 0, "Xeon Gold "},
         {"off-peak", 0x01000000, "EPYC \xC3\xA9 7002\n", 0, 0, 1, "EPYC    7002 "},
-        {"Off ", 0, "~ plain ASCII stays !", 0, 0, 0, "~ plain ASCII stays !"},
         {"of", 0, std::string(60, 'x'), 1, 0, 0, "xxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxxx"},  // 47 kept
         {"Dynamic", 0, std::string("Core\0\t\t", 7), 1, 1, 0, "Core"},
-        {"DYNAMIC-low", 0, "", 1, 1, 0, ""},
         {"dynami", 0, "", 1, 0, 0, ""},
-        {"static", 0, "", 1, 0, 0, ""},
-        {"", 0, "", 1, 0, 0, ""},
-        {" dynamic", 0, "", 1, 0, 0, ""},
+        {"", 1, "~ plain ASCII stays !", 1, 0, 1, "~ plain ASCII stays !"},
     };
     for (const auto &c : cases) {
         HostProcessorSettings host;
