@@ -45,6 +45,10 @@ struct BrokerConfig {
     // loaded, a cleanup that failed. Unset, each goes to stderr as
     // "tvxbroker: <text>". Called from whichever thread hit the problem.
     std::function<void(const std::string &)> diagnostics;
+    // Registration locations served by the running program itself instead of
+    // a lib<location>.so: a test that links providers in and exports their
+    // factories reaches them through the broker like any library.
+    std::vector<std::string> inProcessLocations;
 };
 
 // Receives each delivered indication; returning false refuses it, and the

@@ -3,6 +3,7 @@
 #include <dlfcn.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cstdio>
 
 #include "core/EncSupport.h"
@@ -84,6 +85,11 @@ LoadedLibrary &Broker::State::library(const std::string &location) {
     auto found = libraries.find(location);
     if (found != libraries.end()) return found->second;
     LoadedLibrary &loaded = libraries[location];
+    if (std::find(config.inProcessLocations.begin(), config.inProcessLocations.end(), location) !=
+        config.inProcessLocations.end()) {
+        loaded.handle = dlopen(nullptr, RTLD_NOW);
+        return loaded;
+    }
     const std::string file = "lib" + location + ".so";
     for (const std::string &dir : config.providerDirs) {
         const std::string path = dir + "/" + file;
