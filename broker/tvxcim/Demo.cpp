@@ -11,6 +11,7 @@ namespace tvxcim {
 
 using tvxbroker::Broker;
 using tvxbroker::Instance;
+using tvxbroker::InterfaceKind;
 using tvxbroker::ObjectPath;
 using tvxbroker::ProviderRegistration;
 using tvxbroker::Response;
@@ -57,6 +58,13 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
 // on before each request: with both streams in one file, a provider's line
 // then never lands inside one of the demo's.
 void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
+    // Every provider is loaded first, as on a broker that has served for a
+    // while: those with polling threads have then polled by the time their
+    // classes are shown.
+    for (const ProviderRegistration &registration : broker.registrations()) {
+        if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
+        if (registration.indication) broker.managementInterface(registration.providerName, InterfaceKind::Indication);
+    }
     std::set<std::string> shown;
     std::vector<ObjectPath> firstOfEachClass;
     for (const ProviderRegistration &registration : broker.registrations()) {
@@ -76,7 +84,11 @@ void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
     }
     shown.clear();
     for (const ProviderRegistration &registration : broker.registrations()) {
-        if (registration.indication && shown.insert(registration.className).second) {
+        // Indications of a changed instance come only when something changes
+        // on the host (`tvxcim listen` shows them); the demo waits only for
+        // those a host sends by itself.
+        if (registration.indication && !broker.schema().isA(registration.className, "CIM_InstIndication") &&
+            shown.insert(registration.className).second) {
             writer.flush();
             showFirstIndication(broker, registration.className, line.seconds.value_or(kFirstIndicationSeconds),
                                 writer);
