@@ -30,7 +30,8 @@ CmpiData dataOf(const HostSimValue &value) {
     case HOSTSIM_VALUE_SINT64: return CmpiData(static_cast<CMPISint64>(value.signedValue));
     case HOSTSIM_VALUE_BOOLEAN: return CmpiData(value.unsignedValue != 0);
     case HOSTSIM_VALUE_STRING: return CmpiData(value.text);
-    default: return CmpiData::nullOf(CMPI_uint16);
+    case HOSTSIM_VALUE_NULL:
+    default: return CmpiData::nullOf(CMPI_uint16);  // HealthState's type
     }
 }
 
