@@ -3,7 +3,10 @@
 // hostproviders.map and its classes into hostproviders.reg.
 #include "CmpiProviderFactory.h"
 #include "ComputerSystemProvider.h"
+#include "WatchedElementProvider.h"
 
 CMProviderBase(OMC_UnitaryComputerSystemProvider);
+CMProviderBase(HostWatchedElementProvider);
 
 CMInstanceMIFactory(HostProviders::ComputerSystemProvider, OMC_UnitaryComputerSystemProvider)
+CMInstanceMIFactory(HostProviders::WatchedElementProvider, HostWatchedElementProvider)

@@ -27,6 +27,7 @@ Instance expectedSample(const conf_sample &sample) {
         {{"Text", text(sample.text)},
          {"Made", text(sample.made)},
          {"Missing", nullText},
+         {"Vacant", CimValue::makeNull(CMPI_uint16)},
          {"Enabled", CimValue::makeBoolean(sample.enabled != 0)},
          {"Count", CimValue::makeUnsigned(CMPI_uint64, sample.count)},
          {"Offset", CimValue::makeSigned(CMPI_sint64, sample.offset)},

@@ -95,6 +95,7 @@ CmpiInstance sampleInstance(const conf_sample &sample) {
     inst.setProperty("Text", sample.text);
     inst.setProperty("Made", sample.made);
     inst.setProperty("Missing", CmpiData(static_cast<const char *>(nullptr)));
+    inst.setProperty("Vacant", CmpiData::nullOf(CMPI_uint16));
     inst.setProperty("Enabled", sample.enabled != 0);
     inst.setProperty("Count", sample.count);
     inst.setProperty("Offset", sample.offset);

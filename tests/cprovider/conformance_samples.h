@@ -10,7 +10,8 @@
 #include "cmpi/cmpidt.h"
 
 /* One Conf_CSample. Name is passed as CMPI_chars, Label and Made as
- * CMPIStrings from the broker's newString; Missing is always null. */
+ * CMPIStrings from the broker's newString; Missing (a string) and Vacant (a
+ * uint16) are always null. */
 struct conf_sample {
     const char *name;
     const char *label;

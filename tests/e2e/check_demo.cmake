@@ -5,7 +5,8 @@
 # its kernel IP endpoints, its two processor packages, both hypervisor
 # images (the alternate one from the simulated boot bank) and their
 # association with the computer system the stand-in host providers serve
-# under this host's name, and at the end this host's first heartbeat.
+# under this host's name, a watched element at its first poll, and at the
+# end this host's first heartbeat.
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
 set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
 execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
@@ -40,6 +41,7 @@ set(expected
   "instance of Talvex_HypervisorSoftwareIdentity\n[^}]*InstanceID = \"Talvex Corlai 5.1.0 build-1483097\";[^}]*LastStartTime = "
   "instance of Talvex_HypervisorSoftwareIdentity\n[^}]*InstanceID = \"Alt Boot Bank: Talvex Corlai 5.1.0 build-799733\";"
   "instance of OMC_UnitaryComputerSystem\n[^}]*\n    Name = \"${host}\";[^}]*ElementName = \"${host}\";"
+  "instance of CIM_PhysicalMemory\n[^}]*Tag = \"DIMM_A1\";\n    HealthState = 15;"
   "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
   "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\""
   "== ain root/cimv2:OMC_UnitaryComputerSystem[^\n]*\nroot/cimv2:Talvex_HypervisorSoftwareIdentity.InstanceID=\"Talvex Corlai 5.1.0 build-1483097\"\n\n")

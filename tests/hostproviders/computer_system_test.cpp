@@ -2,11 +2,7 @@
 // named as the product names the host in its own paths, and NOT_FOUND for
 // every other path, to a client and to a provider's up-call alike (an
 // up-call answered OK without an instance kills sfcb's provider process).
-#include "CmpiBroker.h"
-#include "CmpiObjectPath.h"
-#include "CmpiStatus.h"
-#include "ProductBroker.h"
-#include "core/ObjectPool.h"
+#include "UpCall.h"
 
 namespace {
 
@@ -21,23 +17,6 @@ protected:
 
     ObjectPath systemPath(const std::string &cls, const CimValue &creationClassName, const CimValue &name) const {
         return ObjectPath{"", kNs, cls, {{"CreationClassName", creationClassName}, {"Name", name}}};
-    }
-
-    // The status a provider's getInstance up-call for `path` ends in.
-    CMPIrc upCallStatus(const ObjectPath &path) const {
-        const RequestScope request;
-        const CmpiBroker up(broker->cmpiBroker());
-        CmpiObjectPath cop(kNs, path.className.c_str());
-        for (const NamedValue &key : path.keys) {
-            if (key.value.type == CMPI_string) cop.setKey(key.name.c_str(), CmpiData(key.value.text));
-            else cop.setKey(key.name.c_str(), CmpiData(CMPIUint32(key.value.unsignedValue)));
-        }
-        try {
-            up.getInstance(CmpiContext(broker->newContext(kNs)), cop, nullptr);
-        } catch (const CmpiStatus &status) {
-            return status.rc();
-        }
-        return CMPI_RC_OK;
     }
 };
 
@@ -55,7 +34,7 @@ TEST_F(ComputerSystemProvider, ServesTheOneSystemThatTheProductsPathsName) {
         systemPath(kClass, *device.property("SystemCreationClassName"), *device.property("SystemName")), {});
     ASSERT_TRUE(system.ok()) << system.rc;
     EXPECT_EQ(pathTexts(system), pathTexts(names));
-    EXPECT_EQ(upCallStatus(names.paths[0]), CMPI_RC_OK);
+    EXPECT_EQ(upCallStatus(*broker, names.paths[0]), CMPI_RC_OK);
 }
 
 TEST_F(ComputerSystemProvider, EveryOtherPathIsNotFoundToClientsAndUpCalls) {
@@ -75,7 +54,7 @@ TEST_F(ComputerSystemProvider, EveryOtherPathIsNotFoundToClientsAndUpCalls) {
         const Response response = broker->getInstance(c.path, {});
         EXPECT_EQ(response.rc, CMPI_RC_ERR_NOT_FOUND) << c.what;
         EXPECT_TRUE(response.instances.empty()) << c.what;
-        EXPECT_EQ(upCallStatus(c.path), CMPI_RC_ERR_NOT_FOUND) << c.what;
+        EXPECT_EQ(upCallStatus(*broker, c.path), CMPI_RC_ERR_NOT_FOUND) << c.what;
     }
     EXPECT_TRUE(broker->enumInstanceNames(classPath(kUnserved)).paths.empty());
 }

@@ -1,4 +1,5 @@
 #include <atomic>
+#include <cstring>
 #include <thread>
 
 #include "HostSimTesting.h"
@@ -6,8 +7,9 @@
 namespace hostsim_test {
 namespace {
 
-// An adapter inventory's calls, tolerating a profile swapped underneath.
-void walkAdapters() {
+// An adapter inventory's and a health monitor's calls, tolerating a profile
+// swapped underneath.
+void walkHost() {
     char area[21];
     if (PRB_CheckSig(area, sizeof area, nullptr) != 0) return;
     for (const std::string &name : adapterNames()) {
@@ -16,20 +18,31 @@ void walkAdapters() {
         readNode(72, {name}, record);
     }
     HostType_OSIsOSK();
+    HostSimWatchedElements *watched = nullptr;
+    if (HostSim_GetWatchedElements("CIM_Sensor", 1, &watched) != 0) return;
+    // Read after the profile it came from may be gone: the copy must hold.
+    std::size_t textBytes = 0;
+    for (std::size_t i = 0; i < watched->count; ++i) textBytes += std::strlen(watched->elements[i].className);
+    EXPECT_EQ(textBytes, watched->count * std::strlen("CIM_Sensor"));
+    HostSim_FreeWatchedElements(watched);
 }
 
 using HostSimConcurrency = HostSimTest;
 
 TEST_F(HostSimConcurrency, CallsFromManyThreadsWhileProfilesChange) {
+    nlohmann::json sensors =
+        host({{{"name", "vmnic"}, {"count", 8}}}, {{{"call", "PRB_Get"}, {"node", 72}, {"nth", 3}}});
+    sensors["watchedElements"] = {{{"class", "CIM_Sensor"}, {"healthStates", {5, 10}}},
+                                  {{"class", "CIM_Sensor"}, {"hostName", "esx1"}}};
     const std::string profiles[] = {
-        host({{{"name", "vmnic"}, {"count", 8}}}, {{{"call", "PRB_Get"}, {"node", 72}, {"nth", 3}}}).dump(),
+        sensors.dump(),
         nlohmann::json{{"hostType", "Corla"}, {"adapters", nlohmann::json::array({{{"name", "vmnic0"}}})}}.dump(),
     };
     std::atomic<bool> done{false};
     std::vector<std::thread> walkers;
     for (int t = 0; t < 4; ++t) {
         walkers.emplace_back([&done] {
-            while (!done) walkAdapters();
+            while (!done) walkHost();
         });
     }
     for (int swap = 0; swap < 50; ++swap) {

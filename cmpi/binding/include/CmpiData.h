@@ -35,6 +35,9 @@ public:
     CmpiData(const CmpiInstance &value);  // NOLINT
     CmpiData(const CmpiArray &value);  // NOLINT
     CmpiData(const CmpiDateTime &value);  // NOLINT
+    // A null value of the type, as a property or key whose type is known
+    // but whose value is not.
+    static CmpiData nullOf(CMPIType type);
 
     CMPIType type() const { return data.type; }
     bool isNullValue() const { return (data.state & CMPI_nullValue) != 0; }
@@ -58,8 +61,9 @@ public:
     operator CmpiArray() const;  // NOLINT
     operator CmpiDateTime() const;  // NOLINT
 
-    // The value argument to hand to a broker with type(): for CMPI_chars the
-    // C string itself, else a CMPIValue; valid while this object lives.
+    // The value argument to hand to a broker with type(): null for a null
+    // value, for CMPI_chars the C string itself, else a CMPIValue; valid
+    // while this object lives.
     const CMPIValue *value() const;
     const CMPIData &getEnc() const { return data; }
 

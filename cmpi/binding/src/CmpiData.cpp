@@ -70,12 +70,18 @@ CmpiData::CmpiData(const CmpiArray &value)
 CmpiData::CmpiData(const CmpiDateTime &value)
     : data(objectData(CMPI_dateTime, value.getEnc(), &CMPIValue::dateTime)) {}
 
-// Brokers read a CMPI_chars value as the C string itself, not as a
-// CMPIValue holding it: the convention of every C provider.
+CmpiData CmpiData::nullOf(CMPIType type) {
+    CmpiData null;
+    null.data.type = type;
+    return null;
+}
+
+// Brokers read a null pointer as a null value of the type, and a CMPI_chars
+// value as the C string itself, not as a CMPIValue holding it: the
+// conventions of every C provider.
 const CMPIValue *CmpiData::value() const {
-    if (data.type == CMPI_chars) {
-        return isNullValue() ? nullptr : reinterpret_cast<const CMPIValue *>(chars.c_str());
-    }
+    if (isNullValue()) return nullptr;
+    if (data.type == CMPI_chars) return reinterpret_cast<const CMPIValue *>(chars.c_str());
     return &data.value;
 }
 

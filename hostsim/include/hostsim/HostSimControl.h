@@ -4,6 +4,7 @@
 #pragma once
 
 #include <stddef.h>
+#include <stdint.h>
 
 #ifdef __cplusplus
 extern "C" {
@@ -49,6 +50,59 @@ int HostSim_HasServiceConsole(int *hasConsole);
  * HOSTSIM_STATUS_NO_PROFILE. */
 struct SystemVersionInfo;
 int HostSim_GetSystemVersion(struct SystemVersionInfo *info);
+
+/* How a value the profile scripts is served: not at all, as a null uint16,
+ * or as a value of one CIM type. */
+enum HostSimValueType {
+    HOSTSIM_VALUE_MISSING = 0, /* the property is not set */
+    HOSTSIM_VALUE_NULL = 1,    /* set, as a null uint16 */
+    HOSTSIM_VALUE_UINT16 = 2,
+    HOSTSIM_VALUE_UINT64 = 3,
+    HOSTSIM_VALUE_SINT64 = 4,
+    HOSTSIM_VALUE_BOOLEAN = 5,
+    HOSTSIM_VALUE_STRING = 6
+};
+
+struct HostSimValue {
+    enum HostSimValueType type;
+    uint64_t unsignedValue; /* UINT16 and UINT64; BOOLEAN as 0 or 1 */
+    int64_t signedValue;    /* SINT64 */
+    const char *text;       /* STRING; null for every other type */
+};
+
+struct HostSimWatchedKey {
+    const char *name;
+    struct HostSimValue value; /* STRING, UINT64, SINT64 or BOOLEAN */
+};
+
+/* One element of "watchedElements": its object path and the HealthState of
+ * the poll asked for. */
+struct HostSimWatchedElement {
+    const char *className; /* as the profile spells it */
+    const char *nameSpace;
+    const char *hostName;  /* null: the path names no host */
+    const struct HostSimWatchedKey *keys; /* in profile order */
+    size_t keyCount;
+    struct HostSimValue healthState;
+};
+
+struct HostSimWatchedElements {
+    const struct HostSimWatchedElement *elements;
+    size_t count;
+};
+
+/* The elements of "watchedElements" whose class is className (ASCII letters
+ * compared without case), in profile order, as copies that stay valid until
+ * HostSim_FreeWatchedElements whatever profile is loaded meanwhile. Each
+ * class counts its enumerations from 0 since its profile was loaded: with
+ * enumeration non-zero, this is the next one and carries its poll's
+ * HealthState; with 0, the answer carries the last enumerated poll's (poll 0
+ * before any) and counts nothing. Returns 0 and sets *answer (no elements:
+ * count 0), or HOSTSIM_STATUS_BAD_ARGUMENT or HOSTSIM_STATUS_NO_PROFILE and
+ * sets *answer to null. */
+int HostSim_GetWatchedElements(const char *className, int enumeration, struct HostSimWatchedElements **answer);
+/* Frees an answer of HostSim_GetWatchedElements; null is ignored. */
+void HostSim_FreeWatchedElements(struct HostSimWatchedElements *answer);
 
 /* Parameter lists handed out (PRB_ParamListCreate, PRB_GetInstanceListAlloc)
  * and destroyed since the process started; live = created - destroyed.

@@ -11,6 +11,7 @@
 #include "profile/InterfaceTable.h"
 #include "profile/ProcessorProfile.h"
 #include "profile/SystemVersionProfile.h"
+#include "profile/WatchedElementProfile.h"
 
 namespace hostsim {
 
@@ -23,6 +24,7 @@ struct HostProfile {
     InterfaceTable interfaces;
     SystemVersionProfile systemVersion;
     std::vector<FaultRule> faults;
+    WatchedElementTable watchedElements;
 
     const AdapterProfile *findAdapter(const std::string &name) const {
         const auto found = adapterIndex.find(name);

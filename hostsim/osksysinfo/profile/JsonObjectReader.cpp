@@ -10,15 +10,6 @@ namespace hostsim {
 
 namespace {
 
-// What a wrong value was, short enough for a one-line message.
-std::string describe(const nlohmann::json &value) {
-    if (value.is_structured()) return std::string("an ") + value.type_name();
-    std::string text = value.dump();
-    constexpr std::size_t longest = 40;
-    if (text.size() > longest) text = text.substr(0, longest) + "...";
-    return text;
-}
-
 std::optional<std::uint64_t> parseHex(const std::string &text) {
     if (text.size() < 3 || text[0] != '0' || (text[1] != 'x' && text[1] != 'X')) return std::nullopt;
     std::uint64_t value = 0;
@@ -40,16 +31,24 @@ std::optional<std::uint64_t> unsignedValue(const nlohmann::json &value) {
 
 std::string rangeProblem(const std::string &min, const std::string &max, const nlohmann::json &value) {
     return "an integer from " + min + " to " + max + " (or hexadecimal text such as \"0x1f\"), got " +
-           describe(value);
+           describeJson(value);
 }
 
 }  // namespace
+
+std::string describeJson(const nlohmann::json &value) {
+    if (value.is_structured()) return std::string("an ") + value.type_name();
+    std::string text = value.dump();
+    constexpr std::size_t longest = 40;
+    if (text.size() > longest) text = text.substr(0, longest) + "...";
+    return text;
+}
 
 JsonObjectReader::JsonObjectReader(const nlohmann::json &object, std::string path)
     : object_(object), path_(std::move(path)) {
     if (!object_.is_object()) {
         throw ProfileError((path_.empty() ? std::string("profile") : path_) + ": expected an object, got " +
-                           describe(object_));
+                           describeJson(object_));
     }
 }
 
@@ -70,7 +69,7 @@ const nlohmann::json *JsonObjectReader::field(const char *key) {
 std::optional<std::string> JsonObjectReader::text(const char *key) {
     const nlohmann::json *value = field(key);
     if (!value) return std::nullopt;
-    if (!value->is_string()) fail(key, "expected a text, got " + describe(*value));
+    if (!value->is_string()) fail(key, "expected a text, got " + describeJson(*value));
     return value->get<std::string>();
 }
 
@@ -80,7 +79,7 @@ std::optional<std::string> JsonObjectReader::textOrInteger(const char *key) {
     if (value->is_string()) return value->get<std::string>();
     if (value->is_number_unsigned()) return std::to_string(value->get<std::uint64_t>());
     if (value->is_number_integer()) return std::to_string(value->get<std::int64_t>());
-    fail(key, "expected a text or an integer, got " + describe(*value));
+    fail(key, "expected a text or an integer, got " + describeJson(*value));
 }
 
 std::optional<std::uint64_t> JsonObjectReader::unsignedInteger(const char *key, std::uint64_t min,
@@ -113,7 +112,7 @@ std::optional<std::int64_t> JsonObjectReader::signedInteger(const char *key, std
 std::optional<bool> JsonObjectReader::boolean(const char *key) {
     const nlohmann::json *value = field(key);
     if (!value) return std::nullopt;
-    if (!value->is_boolean()) fail(key, "expected true or false, got " + describe(*value));
+    if (!value->is_boolean()) fail(key, "expected true or false, got " + describeJson(*value));
     return value->get<bool>();
 }
 
@@ -142,13 +141,22 @@ bool JsonObjectReader::object(const char *key, const std::function<void(JsonObje
 }
 
 void JsonObjectReader::eachObject(const char *key, const std::function<void(JsonObjectReader &element)> &read) {
+    eachValue(key, [&read](const nlohmann::json &value, const std::string &path) {
+        JsonObjectReader element(value, path);
+        read(element);
+    });
+}
+
+void JsonObjectReader::eachValue(
+    const char *key, const std::function<void(const nlohmann::json &element, const std::string &path)> &read) {
     const nlohmann::json *value = field(key);
     if (!value) return;
-    if (!value->is_array()) fail(key, "expected an array, got " + describe(*value));
-    for (std::size_t i = 0; i < value->size(); ++i) {
-        JsonObjectReader element((*value)[i], fieldPath(key) + "[" + std::to_string(i) + "]");
-        read(element);
-    }
+    if (!value->is_array()) fail(key, "expected an array, got " + describeJson(*value));
+    for (std::size_t i = 0; i < value->size(); ++i) read((*value)[i], fieldPath(key) + "[" + std::to_string(i) + "]");
+}
+
+const nlohmann::json *JsonObjectReader::anyValue(const char *key) {
+    return field(key);
 }
 
 void JsonObjectReader::finish() const {

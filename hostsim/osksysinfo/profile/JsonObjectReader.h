@@ -14,6 +14,9 @@
 
 namespace hostsim {
 
+// What a wrong value was, short enough for a one-line message.
+std::string describeJson(const nlohmann::json &value);
+
 class JsonObjectReader {
 public:
     // `path` is the object's own path, empty for the top level.
@@ -40,6 +43,12 @@ public:
     // Reads each element of the array `key` (absent: none) as an object
     // whose path is "key[i]".
     void eachObject(const char *key, const std::function<void(JsonObjectReader &element)> &read);
+    // The same for elements of any JSON type, each with its path.
+    void eachValue(const char *key,
+                   const std::function<void(const nlohmann::json &element, const std::string &path)> &read);
+    // The field whatever its JSON type, for a caller that tells the types
+    // apart itself; null when absent.
+    const nlohmann::json *anyValue(const char *key);
 
     [[noreturn]] void fail(const char *key, const std::string &problem) const;
     std::string fieldPath(const char *key) const;

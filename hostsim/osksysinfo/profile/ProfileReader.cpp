@@ -41,6 +41,7 @@ HostProfile parseProfile(const std::string &json) {
     readInterfaces(host, profile);
     readSystemVersion(host, profile);
     readFaults(host, profile);
+    readWatchedElements(host, profile);
     host.finish();
     return profile;
 }

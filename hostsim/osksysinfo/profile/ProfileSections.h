@@ -12,5 +12,6 @@ void readProcessors(JsonObjectReader &host, HostProfile &profile);
 void readInterfaces(JsonObjectReader &host, HostProfile &profile);
 void readSystemVersion(JsonObjectReader &host, HostProfile &profile);
 void readFaults(JsonObjectReader &host, HostProfile &profile);
+void readWatchedElements(JsonObjectReader &host, HostProfile &profile);
 
 }  // namespace hostsim

@@ -21,10 +21,9 @@ void ProfileStore::loadIfNeeded() {
     const char *path = std::getenv("TVX_HOST_PROFILE");
     const bool useDefault = path == nullptr || *path == '\0';
     try {
-        auto profile = std::make_shared<const HostProfile>(useDefault ? parseProfile(defaultProfileText())
-                                                                      : readProfileFile(path));
-        matchedCalls_.assign(profile->faults.size(), 0);
-        profile_ = std::move(profile);
+        profile_ = std::make_shared<const HostProfile>(useDefault ? parseProfile(defaultProfileText())
+                                                                  : readProfileFile(path));
+        restartCounts();
     } catch (const std::exception &error) {
         const std::string origin = useDefault ? "built-in profile: " : "";
         std::fprintf(stderr, "hostsim: %s%s\n", origin.c_str(), error.what());
@@ -55,8 +54,8 @@ void ProfileStore::serve(HostProfile profile) {
     // After the swap `served` holds the old profile, freed once the lock is released.
     std::shared_ptr<const HostProfile> served = std::make_shared<const HostProfile>(std::move(profile));
     const std::lock_guard<std::mutex> lock(mutex_);
-    matchedCalls_.assign(served->faults.size(), 0);
     profile_.swap(served);
+    restartCounts();
     loaded_ = true;
 }
 
@@ -64,8 +63,30 @@ void ProfileStore::reset() {
     std::shared_ptr<const HostProfile> released;  // freed after the lock is released
     const std::lock_guard<std::mutex> lock(mutex_);
     released = std::move(profile_);
-    matchedCalls_.clear();
+    restartCounts();
     loaded_ = false;
+}
+
+void ProfileStore::restartCounts() {
+    matchedCalls_.assign(profile_ ? profile_->faults.size() : 0, 0);
+    enumerations_.assign(profile_ ? profile_->watchedElements.classCount() : 0, 0);
+}
+
+WatchedPoll ProfileStore::watchedPoll(const std::string &className, bool enumeration) {
+    const std::lock_guard<std::mutex> lock(mutex_);
+    loadIfNeeded();
+    WatchedPoll result{profile_};
+    if (!profile_) return result;
+    const std::optional<std::size_t> classNumber = profile_->watchedElements.findClass(className);
+    if (!classNumber) return result;
+    result.elements = &profile_->watchedElements.elementsOf(*classNumber);
+    std::uint64_t &enumerated = enumerations_[*classNumber];
+    if (enumeration) {
+        result.poll = enumerated++;
+    } else {
+        result.poll = enumerated == 0 ? 0 : enumerated - 1;
+    }
+    return result;
 }
 
 }  // namespace hostsim

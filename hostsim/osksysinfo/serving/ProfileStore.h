@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <memory>
 #include <mutex>
+#include <string>
 #include <vector>
 
 #include "profile/HostProfile.h"
@@ -18,6 +19,13 @@ struct Consultation {
     const FaultRule *fault = nullptr;            // the rule failing this call, if any
 };
 
+// A class's watched elements, and the poll whose HealthStates they carry.
+struct WatchedPoll {
+    std::shared_ptr<const HostProfile> profile;                    // null: no profile could be read
+    const std::vector<WatchedElementProfile> *elements = nullptr;  // null: none of the class
+    std::uint64_t poll = 0;
+};
+
 class ProfileStore {
 public:
     static ProfileStore &instance();
@@ -26,17 +34,24 @@ public:
     // The current profile, and the fault rule (if any) that fails this call;
     // counts the call against every rule it matches.
     Consultation consult(const Call &call);
+    // The elements of the class. An enumeration is counted as the class's
+    // next one and carries its poll; otherwise the last enumerated poll
+    // (0 before any) is carried and nothing is counted.
+    WatchedPoll watchedPoll(const std::string &className, bool enumeration);
 
     void serve(HostProfile profile);
     void reset();
 
 private:
     void loadIfNeeded();
+    // Every call and enumeration count starts again with the profile.
+    void restartCounts();
 
     std::mutex mutex_;
     bool loaded_ = false;
     std::shared_ptr<const HostProfile> profile_;
     std::vector<std::uint64_t> matchedCalls_;  // per fault rule of profile_
+    std::vector<std::uint64_t> enumerations_;  // per class of profile_'s watched elements
 };
 
 }  // namespace hostsim

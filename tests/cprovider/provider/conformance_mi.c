@@ -90,6 +90,7 @@ static CMPIInstance *sample_instance(const char *ns, const struct conf_sample *s
     v.string = text(s->made);
     SET_PROPERTY(ci, "Made", &v, CMPI_string);
     SET_PROPERTY(ci, "Missing", NULL, CMPI_chars);
+    SET_PROPERTY(ci, "Vacant", NULL, CMPI_uint16);
     v.boolean = s->enabled;
     SET_PROPERTY(ci, "Enabled", &v, CMPI_boolean);
     v.uint64 = s->count;
