@@ -32,8 +32,12 @@ CMPIString *getNameSpace(const CMPIObjectPath *op, CMPIStatus *rc) {
 CMPIStatus setHostname(CMPIObjectPath *op, const char *host) {
     return setText(op, &ObjectPath::host, host);
 }
+// A path without a host answers a string whose characters are null, as in
+// sfcb, never an empty text.
 CMPIString *getHostname(const CMPIObjectPath *op, CMPIStatus *rc) {
-    return getText(op, &ObjectPath::host, rc);
+    CMPIString *host = getText(op, &ObjectPath::host, rc);
+    if (EncString *text = stringOf(host); text != nullptr && text->text.empty()) text->null = true;
+    return host;
 }
 CMPIStatus setClassName(CMPIObjectPath *op, const char *cn) {
     return setText(op, &ObjectPath::className, cn);

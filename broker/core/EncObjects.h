@@ -25,6 +25,7 @@ struct Encapsulated : PooledObject {
 
 struct EncString : Encapsulated<CMPIString> {
     std::string text;
+    bool null = false;  // a string without characters, as sfcb returns for an absent host
 };
 
 struct EncArray : Encapsulated<CMPIArray> {

@@ -16,7 +16,7 @@ char *stringCharPtr(const CMPIString *s, CMPIStatus *rc) {
         return nullptr;
     }
     setRc(rc, CMPI_RC_OK);
-    return string->text.data();
+    return string->null ? nullptr : string->text.data();
 }
 
 // ---- CMPIArray ----

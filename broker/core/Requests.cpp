@@ -91,7 +91,9 @@ std::vector<InstanceTarget> instanceTargets(const Broker::State &state, const Ob
             known = known || (target.provider == registration.providerName &&
                               equalsIgnoreCase(target.className, registration.className));
         }
-        if (!known) targets.push_back({registration.providerName, registration.className});
+        // sfcb names the registered class only where it differs beyond letter case.
+        const bool requested = equalsIgnoreCase(registration.className, path.className);
+        if (!known) targets.push_back({registration.providerName, requested ? path.className : registration.className});
     }
     return targets;
 }

@@ -1,6 +1,7 @@
 // The two polling threads as the shipped factories start them, driven by
 // waking them as a spurious wake-up would instead of waiting a period.
-// Each case runs in a process of its own, so each starts with fresh state.
+// A stop is final for the process, so each case needs a process of its own,
+// as ctest runs them.
 #include <gmock/gmock.h>
 #include <ifaddrs.h>
 #include <syslog.h>
@@ -111,11 +112,12 @@ TEST_F(ThreadsTest, RequestsDuringPollsSeeWholePolls) {
     }
     serve(profileWith(elements));
     instanceMI();
+    ASSERT_TRUE(eventually([] { return threadsInLoop() == 2 && recordOf("s199"); })) << "the first poll";
     std::atomic<bool> polling{true};
     std::thread waker([&] {
         for (int poll = 1; poll < 10; ++poll) {
             wakeThreads();
-            eventually([&] { return recordOf("s199") && recordOf("s199")->healthState == 10 + poll; });
+            eventually([&] { return recordOf("s199")->healthState >= 10 + poll; });
         }
         polling = false;
     });
@@ -136,6 +138,7 @@ TEST_F(ThreadsTest, RequestsDuringPollsSeeWholePolls) {
 
 TEST_F(ThreadsTest, EnableAndDisableRaceDetectionCycles) {
     instanceMI();
+    ASSERT_TRUE(eventually([] { return threadsInLoop() == 2; }));
     std::atomic<bool> racing{true};
     std::thread switcher([&] {
         while (racing) {
