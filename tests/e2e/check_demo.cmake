@@ -6,9 +6,11 @@
 # images (the alternate one from the simulated boot bank) and their
 # association with the computer system the stand-in host providers serve
 # under this host's name, and at the end this host's first heartbeat.
+# OPTIONS, when given, go before the command (--stock-sfcb).
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
-set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
-execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
+string(REPLACE "-" "" run "tvxcim${OPTIONS}_demo")
+set(log "${CMAKE_CURRENT_BINARY_DIR}/${run}.log")
+execute_process(COMMAND ${EMULATOR} ${TVXCIM} ${OPTIONS} demo
                 RESULT_VARIABLE status OUTPUT_FILE "${log}" ERROR_FILE "${log}")
 file(READ "${log}" shown)
 if(NOT status EQUAL 0)
