@@ -129,11 +129,17 @@ void Broker::shutdown() { state->shutdown(); }
 const CMPIBroker *Broker::cmpiBroker() const { return &state->cmpi; }
 
 const CMPIContext *Broker::newContext(const std::string &nameSpace) {
-    std::unique_ptr<EncContext> context = enc::makeContext(requestContextEntries(nameSpace));
+    std::unique_ptr<EncContext> context =
+        enc::makeContext(state->contextTable, requestContextEntries(nameSpace));
     const CMPIContext *handle = &context->cmpi;
     std::lock_guard<std::mutex> lock(state->threadMutex);
     state->spareContexts.push_back(std::move(context));
     return handle;
+}
+
+std::vector<std::string> Broker::threadedProviders() const {
+    std::lock_guard<std::mutex> lock(state->threadMutex);
+    return state->threadedProviders;
 }
 
 const ClassSchema &Broker::schema() const { return state->config.schema; }

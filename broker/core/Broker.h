@@ -37,10 +37,22 @@ using PropertyList = std::optional<std::vector<std::string>>;
 
 enum class InterfaceKind { Instance, Association, Indication };
 
+// How an attached provider thread gives back the objects the broker created
+// for it, which tells the two brokers a provider meets apart.
+enum class ThreadRelease {
+    // The host's broker: the context table's eighth entry,
+    // releaseThreadObjects; no memory table.
+    ContextEntry,
+    // Stock sfcb 1.3: contexts with the seven published entries only, and
+    // the memory table's mark and release.
+    MarkRelease,
+};
+
 struct BrokerConfig {
     std::vector<std::string> providerDirs;  // searched for lib<location>.so
     std::vector<ProviderRegistration> registrations;
     ClassSchema schema;
+    ThreadRelease threadRelease = ThreadRelease::ContextEntry;
     // Receives what the broker reports on its own: a provider that cannot be
     // loaded, a cleanup that failed. Unset, each goes to stderr as
     // "tvxbroker: <text>". Called from whichever thread hit the problem.
@@ -116,6 +128,10 @@ public:
     // context lives until shutdown.
     const CMPIBroker *cmpiBroker() const;
     const CMPIContext *newContext(const std::string &nameSpace);
+
+    // The providers that prepared a thread context while being loaded (by
+    // their factory or initialize), by registered name, in the order seen.
+    std::vector<std::string> threadedProviders() const;
 
     const ClassSchema &schema() const;
     const std::vector<ProviderRegistration> &registrations() const;

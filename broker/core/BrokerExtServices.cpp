@@ -1,14 +1,12 @@
-// The operating-system services and memory table of the broker, over POSIX
-// threads and the C heap.
+// The operating-system services of the broker, over POSIX threads.
 #include <pthread.h>
 #include <unistd.h>
 
-#include <cstdlib>
+#include <cerrno>
 #include <cstring>
 #include <string>
 
 #include "core/BrokerState.h"
-#include "core/EncSupport.h"
 
 namespace tvxbroker {
 
@@ -116,35 +114,6 @@ int timedCondWait(void *cond, void *mutex, struct timespec *wait) {
 
 int signalCondition(void *cond) { return pthread_cond_signal(static_cast<pthread_cond_t *>(cond)); }
 
-// ---- memory: objects are pooled already, so marks have nothing to do ----
-CMPIGcStat *mark(const CMPIBroker *, CMPIStatus *rc) {
-    enc::setRc(rc, CMPI_RC_OK);
-    return nullptr;
-}
-
-CMPIStatus releaseMark(const CMPIBroker *, const CMPIGcStat *) { return enc::status(CMPI_RC_OK); }
-
-void *cmpiMalloc(const CMPIBroker *, size_t size) { return std::malloc(size); }
-void *cmpiCalloc(const CMPIBroker *, size_t count, size_t size) { return std::calloc(count, size); }
-void *cmpiRealloc(const CMPIBroker *, void *ptr, size_t size) { return std::realloc(ptr, size); }
-char *cmpiStrDup(const CMPIBroker *, const char *str) {
-    return str != nullptr ? strdup(str) : nullptr;
-}
-void cmpiFree(const CMPIBroker *, void *ptr) { std::free(ptr); }
-
-template <class Object, class Handle>
-void freeWith(Object *(*lookupFunction)(const Handle *), Handle *handle) {
-    if (Object *object = lookupFunction(handle)) enc::releaseObject(object);
-}
-
-void freeInstance(const CMPIBroker *, CMPIInstance *inst) { freeWith(enc::instanceOf, inst); }
-void freeObjectPath(const CMPIBroker *, CMPIObjectPath *op) { freeWith(enc::pathOf, op); }
-void freeArgs(const CMPIBroker *, CMPIArgs *) {}
-void freeString(const CMPIBroker *, CMPIString *s) { freeWith(enc::stringOf, s); }
-void freeArray(const CMPIBroker *, CMPIArray *a) { freeWith(enc::arrayOf, a); }
-void freeDateTime(const CMPIBroker *, CMPIDateTime *d) { freeWith(enc::dateTimeOf, d); }
-void freeSelectExp(const CMPIBroker *, CMPISelectExp *s) { freeWith(enc::selectExpOf, s); }
-
 }  // namespace
 
 const CMPIBrokerExtFT brokerExtFT = {
@@ -153,10 +122,5 @@ const CMPIBrokerExtFT brokerExtFT = {
     getThreadSpecific,  setThreadSpecific, newMutex,       destroyMutex,      lockMutex,
     unlockMutex,        newCondition,    destroyCondition, condWait,          timedCondWait,
     signalCondition};
-
-const CMPIBrokerMemFT brokerMemFT = {
-    CMPICurrentVersion, mark,         releaseMark,    cmpiMalloc,    cmpiCalloc,
-    cmpiRealloc,        cmpiStrDup,   cmpiFree,       freeInstance,  freeObjectPath,
-    freeArgs,           freeString,   freeArray,      freeDateTime,  freeSelectExp};
 
 }  // namespace tvxbroker

@@ -60,6 +60,25 @@ CMPIStatus cleanupInterface(void *mi, InterfaceKind kind, const CMPIContext *ctx
     return enc::status(CMPI_RC_ERR_INVALID_HANDLE);
 }
 
+// Names the provider whose factory runs on this thread, so that a thread
+// context it prepares is put down to it; null while a provider serves a
+// request. Both nest when an initialize makes an up-call.
+class LoadingProvider {
+public:
+    explicit LoadingProvider(const std::string *provider) : previous(current) { current = provider; }
+    LoadingProvider(const LoadingProvider &) = delete;
+    LoadingProvider &operator=(const LoadingProvider &) = delete;
+    ~LoadingProvider() { current = previous; }
+
+    static const std::string *name() { return current; }
+
+private:
+    static thread_local const std::string *current;
+    const std::string *previous;
+};
+
+thread_local const std::string *LoadingProvider::current = nullptr;
+
 std::string messageOf(const CMPIStatus &status) {
     EncString *text = enc::stringOf(status.msg);
     return text != nullptr ? text->text : std::string();
@@ -73,12 +92,15 @@ std::vector<NamedValue> requestContextEntries(const std::string &nameSpace) {
             NamedValue{CMPIPrincipal, CimValue::makeString("root")}};
 }
 
-Broker::State::State(BrokerConfig configuration) : config(std::move(configuration)) {
+Broker::State::State(BrokerConfig configuration)
+    : config(std::move(configuration)),
+      contextTable(config.threadRelease == ThreadRelease::MarkRelease ? &enc::publishedContextFT
+                                                                      : &enc::contextFT.base) {
     cmpi.hdl = this;
     cmpi.bft = &brokerFT;
     cmpi.eft = &brokerEncFT;
     cmpi.xft = &brokerExtFT;
-    cmpi.mft = &brokerMemFT;
+    cmpi.mft = config.threadRelease == ThreadRelease::MarkRelease ? &brokerMemFT : nullptr;
 }
 
 LoadedLibrary &Broker::State::library(const std::string &location) {
@@ -137,8 +159,9 @@ void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std
         RequestScope scope;
         const std::string nameSpace =
             registration->namespaces.empty() ? "root/cimv2" : registration->namespaces.front();
-        CMPIContext *ctx = enc::newContext(requestContextEntries(nameSpace));
+        CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
         CMPIStatus rc = enc::status(CMPI_RC_OK);
+        const LoadingProvider loading(&provider);
         try {
             loaded.mi = callFactory(factory, kind, &cmpi, ctx, &rc);
             if (loaded.mi == nullptr) {
@@ -156,11 +179,16 @@ void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std
 
 CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
     auto thread = std::make_unique<ThreadContextState>();
-    thread->context = enc::makeContext(from.entries);
+    thread->context = enc::makeContext(contextTable, from.entries);
     thread->context->thread = thread.get();
     CMPIContext *handle = &thread->context->cmpi;
     std::lock_guard<std::mutex> lock(threadMutex);
     threadContexts.push_back(std::move(thread));
+    const std::string *loading = LoadingProvider::name();
+    if (loading != nullptr &&
+        std::find(threadedProviders.begin(), threadedProviders.end(), *loading) == threadedProviders.end()) {
+        threadedProviders.push_back(*loading);
+    }
     return handle;
 }
 
@@ -176,10 +204,11 @@ void Broker::State::callProvider(
         return;
     }
     RequestScope scope;
-    CMPIContext *ctx = enc::newContext(requestContextEntries(nameSpace));
+    CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
     EncResult result;
     enc::bindResult(result, response);
     const std::size_t first = response.instances.size();
+    const LoadingProvider serving(nullptr);
     try {
         const CMPIStatus status = call(mi, ctx, &result.cmpi);
         response.rc = status.rc;

@@ -34,6 +34,7 @@ struct Broker::State {
 
     BrokerConfig config;
     CMPIBroker cmpi{};
+    const CMPIContextFT *contextTable;  // of every context made, as the release mode has it
 
     // Loading may recurse: a provider's initialize can make up-calls that
     // load other providers on the same thread.
@@ -44,6 +45,7 @@ struct Broker::State {
     std::mutex threadMutex;
     std::vector<std::unique_ptr<ThreadContextState>> threadContexts;
     std::vector<std::unique_ptr<EncContext>> spareContexts;
+    std::vector<std::string> threadedProviders;
 
     std::mutex subscriberMutex;
     std::map<int, IndicationSubscriber> subscribers;

@@ -43,7 +43,7 @@ std::string typeNameOf(const void *handle) {
                  {&dateTimeFT, "CMPIDateTime"},   {&objectPathFT, "CMPIObjectPath"},
                  {&instanceFT, "CMPIInstance"},   {&enumerationFT, "CMPIEnumeration"},
                  {&selectExpFT, "CMPISelectExp"}, {&contextFT, "CMPIContext"},
-                 {&resultFT, "CMPIResult"}};
+                 {&publishedContextFT, "CMPIContext"}, {&resultFT, "CMPIResult"}};
     for (const auto &entry : known) {
         if (entry.table == table) return entry.name;
     }

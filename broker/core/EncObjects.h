@@ -87,10 +87,10 @@ CMPIObjectPath *newObjectPath(ObjectPath value);
 CMPIInstance *newInstance(Instance value);
 CMPIEnumeration *newEnumeration(std::vector<CimValue> items);
 CMPISelectExp *newSelectExp(std::string query, std::string language);
-CMPIContext *newContext(std::vector<NamedValue> entries);
+CMPIContext *newContext(const CMPIContextFT *table, std::vector<NamedValue> entries);
 
 // A context that no pool owns, for thread contexts and tests.
-std::unique_ptr<EncContext> makeContext(std::vector<NamedValue> entries);
+std::unique_ptr<EncContext> makeContext(const CMPIContextFT *table, std::vector<NamedValue> entries);
 void bindResult(EncResult &result, Response &response);
 
 // The object behind a handle the broker made, or null for null and for

@@ -12,7 +12,8 @@ extern const CMPIObjectPathFT objectPathFT;
 extern const CMPIInstanceFT instanceFT;
 extern const CMPIEnumerationFT enumerationFT;
 extern const CMPISelectExpFT selectExpFT;
-extern const CMPIContextExtFT contextFT;
+extern const CMPIContextExtFT contextFT;        // the host's broker: eight entries
+extern const CMPIContextFT publishedContextFT;  // stock sfcb: seven
 extern const CMPIResultFT resultFT;
 
 template <class Object, class Table>

@@ -1,6 +1,5 @@
 #include "core/ObjectPool.h"
 
-
 namespace tvxbroker {
 
 std::atomic<std::size_t> ObjectPool::live{0};
@@ -11,9 +10,9 @@ thread_local ObjectPool *currentPool = nullptr;
 
 void ObjectPool::adopt(std::unique_ptr<PooledObject> object) {
     object->pool = this;
-    PooledObject *key = object.get();
     std::lock_guard<std::mutex> lock(mutex);
-    objects.emplace(key, std::move(object));
+    object->sequence = nextSequence++;
+    objects.emplace(object->sequence, std::move(object));
     ++live;
 }
 
@@ -21,19 +20,19 @@ void ObjectPool::release(PooledObject *object) {
     std::unique_ptr<PooledObject> owned;
     {
         std::lock_guard<std::mutex> lock(mutex);
-        auto found = objects.find(object);
-        if (found == objects.end()) return;
+        auto found = objects.find(object->sequence);
+        if (found == objects.end() || found->second.get() != object) return;
         owned = std::move(found->second);
         objects.erase(found);
     }
     --live;
 }
 
-void ObjectPool::releaseAll() {
-    std::unordered_map<PooledObject *, std::unique_ptr<PooledObject>> doomed;
+void ObjectPool::releaseFrom(std::uint64_t sequence) {
+    std::map<std::uint64_t, std::unique_ptr<PooledObject>> doomed;
     {
         std::lock_guard<std::mutex> lock(mutex);
-        doomed.swap(objects);
+        for (auto it = objects.lower_bound(sequence); it != objects.end();) doomed.insert(objects.extract(it++));
     }
     live -= doomed.size();
 }

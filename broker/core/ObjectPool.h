@@ -2,14 +2,16 @@
 // lands in the pool current on the creating thread: a request's pool (freed
 // when the request ends), an attached thread's pool (freed by
 // releaseThreadObjects and detachThread) or, for a thread that never
-// attached, the process pool (freed at shutdown).
+// attached, the process pool (freed at shutdown). A pool numbers what it
+// adopts, so a memory mark can free exactly what came after it.
 #pragma once
 
 #include <atomic>
 #include <cstddef>
+#include <cstdint>
+#include <map>
 #include <memory>
 #include <mutex>
-#include <unordered_map>
 
 namespace tvxbroker {
 
@@ -19,6 +21,7 @@ class PooledObject {
 public:
     virtual ~PooledObject() = default;
     ObjectPool *pool = nullptr;  // null for clones, which their holder releases
+    std::uint64_t sequence = 0;  // order of adoption within the pool
 };
 
 class ObjectPool {
@@ -31,7 +34,9 @@ public:
     void adopt(std::unique_ptr<PooledObject> object);
     // Frees one object now (a provider's explicit release).
     void release(PooledObject *object);
-    void releaseAll();
+    // Frees every object adopted at or after `sequence`.
+    void releaseFrom(std::uint64_t sequence);
+    void releaseAll() { releaseFrom(0); }
     std::size_t size() const;
 
     // The pool new objects go to on this thread.
@@ -44,7 +49,8 @@ public:
 
 private:
     mutable std::mutex mutex;
-    std::unordered_map<PooledObject *, std::unique_ptr<PooledObject>> objects;
+    std::map<std::uint64_t, std::unique_ptr<PooledObject>> objects;  // by sequence
+    std::uint64_t nextSequence = 0;
     static std::atomic<std::size_t> live;
 };
 

@@ -25,6 +25,9 @@ const char *const usageText =
     "  --seconds N           demo: wait at most N seconds for each first indication\n"
     "                        (10 by default); listen: stop after N seconds\n"
     "  --json                JSON instead of MOF, one object per line (see below)\n"
+    "  --stock-sfcb          behave as stock sfcb 1.3, not the host's broker: provider\n"
+    "                        threads give objects back by memory mark and release,\n"
+    "                        and contexts have only the seven published entries\n"
     "  --help                this text\n"
     "  Without --provider-dir, --registration and --mof: this build's product\n"
     "  (libtvxprovider.so) and stand-in host providers (libtvxhostproviders.so),\n"
@@ -91,6 +94,7 @@ CommandLine parseCommandLine(const std::vector<std::string> &args) {
         else if (option == "--result-role") line.resultRole = value(option);
         else if (option == "--seconds") line.seconds = parseSeconds(value(option));
         else if (option == "--json") line.json = true;
+        else if (option == "--stock-sfcb") line.stockSfcb = true;
         else if (option == "--help") return helpOnly();
         else throw UsageError("unknown option " + option);
     }

@@ -27,6 +27,10 @@ struct CommandLine {
     // and how long listen listens (until interrupted when not given).
     std::optional<double> seconds;
     bool json = false;
+    // Stand in for stock sfcb 1.3 rather than the host's broker: provider
+    // threads give their objects back with the memory table's mark and
+    // release, and contexts have no eighth entry.
+    bool stockSfcb = false;
     bool help = false;  // nothing else is read then
     std::string command;
     std::string argument;

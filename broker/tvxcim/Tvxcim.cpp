@@ -48,6 +48,7 @@ void serve(const CommandLine &line, std::ostream &out, BrokerReports &reports) {
     tvxbroker::BrokerConfig config =
         tvxbroker::loadBrokerConfig(line.providerDirs, line.registrations, line.mofFiles);
     config.diagnostics = reports.sink();
+    if (line.stockSfcb) config.threadRelease = tvxbroker::ThreadRelease::MarkRelease;
     tvxbroker::Broker broker(std::move(config));
     const std::unique_ptr<ResultWriter> writer = line.json ? makeJsonWriter(out) : makeMofWriter(out);
     runCommand(broker, line, *writer);

@@ -7,6 +7,7 @@
 #include <cstddef>
 #include <type_traits>
 
+#include "cmpi/cmpi_context_ext.h"
 #include "cmpi/cmpift.h"
 
 namespace {
@@ -96,6 +97,12 @@ static_assert(std::is_same<decltype(CMPIIndicationMIFT::enableIndications),
                            CMPIStatus (*)(CMPIIndicationMI *, const CMPIContext *)>::value, "");
 static_assert(std::is_same<decltype(CMPIBrokerExtFT::createThreadKey),
                            int (*)(unsigned int *, void (*)(void *))>::value, "");
+
+// The host broker's eighth context entry follows the published seven.
+TEST(CmpiAbi, TheHostContextEntryFollowsThePublishedTable) {
+    EXPECT_EQ(offsetof(CMPIContextExtFT, releaseThreadObjects), sizeof(CMPIContextFT));
+    EXPECT_EQ(sizeof(CMPIContextExtFT), sizeof(CMPIContextFT) + P);
+}
 
 TEST(CmpiAbi, ObjectsAndBrokerAreHandlePlusTables) {
     EXPECT_EQ(offsetof(CMPIInstance, ft), P);

@@ -7,9 +7,11 @@
 # association with the computer system the stand-in host providers serve
 # under this host's name, a watched element at its first poll, and at the
 # end this host's first heartbeat.
+# OPTIONS, when given, go before the command (--stock-sfcb).
 cmake_host_system_information(RESULT host QUERY HOSTNAME)
-set(log "${CMAKE_CURRENT_BINARY_DIR}/tvxcim_demo.log")
-execute_process(COMMAND ${EMULATOR} ${TVXCIM} demo
+string(REPLACE "-" "" run "tvxcim${OPTIONS}_demo")
+set(log "${CMAKE_CURRENT_BINARY_DIR}/${run}.log")
+execute_process(COMMAND ${EMULATOR} ${TVXCIM} ${OPTIONS} demo
                 RESULT_VARIABLE status OUTPUT_FILE "${log}" ERROR_FILE "${log}")
 file(READ "${log}" shown)
 if(NOT status EQUAL 0)
