@@ -29,7 +29,7 @@ const ProviderRegistration *registrationOf(const BrokerConfig &config, const std
     return nullptr;
 }
 
-void *callFactory(void *factory, InterfaceKind kind, CMPIBroker *broker, const CMPIContext *ctx,
+void *invokeFactory(void *factory, InterfaceKind kind, CMPIBroker *broker, const CMPIContext *ctx,
                   CMPIStatus *rc) {
     switch (kind) {
     case InterfaceKind::Instance:
@@ -136,45 +136,68 @@ void Broker::State::report(const std::string &text) const {
 }
 
 void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std::string *error) {
-    std::lock_guard<std::recursive_mutex> lock(loadMutex);
-    for (const LoadedInterface &known : interfaces) {
-        if (known.provider == provider && known.kind == kind) {
-            if (error != nullptr) *error = known.error;
-            return known.mi;
+    std::unique_lock<std::mutex> lock(loadMutex);
+    for (;;) {
+        for (const LoadedInterface &known : interfaces) {
+            if (known.provider == provider && known.kind == kind) {
+                if (error != nullptr) *error = known.error;
+                return known.mi;
+            }
         }
+        const auto busy = factoriesRunning.find(provider);
+        if (busy == factoriesRunning.end()) break;
+        if (busy->second == std::this_thread::get_id()) {
+            // Its own initialize asking for it: there is nothing to hand out yet.
+            if (error != nullptr) *error = "provider " + provider + " is still being loaded";
+            return nullptr;
+        }
+        loadEnded.wait(lock);
     }
     LoadedInterface loaded{provider, kind, nullptr, ""};
     const std::string symbol = provider + "_Create_" + kindName(kind) + "MI";
     const ProviderRegistration *registration = registrationOf(config, provider);
+    void *factory = nullptr;
     if (shutDown) {
         loaded.error = "the broker has shut down";
     } else if (registration == nullptr) {
         loaded.error = "provider " + provider + " is not registered";
     } else if (LoadedLibrary &lib = library(registration->location); lib.handle == nullptr) {
         loaded.error = "provider " + provider + ": " + lib.error;
-    } else if (void *factory = dlsym(lib.handle, symbol.c_str()); factory == nullptr) {
+    } else if (factory = dlsym(lib.handle, symbol.c_str()); factory == nullptr) {
         loaded.error = "provider " + provider + ": library lib" + registration->location +
                        ".so has no factory " + symbol;
-    } else {
-        RequestScope scope;
-        const std::string nameSpace =
-            registration->namespaces.empty() ? "root/cimv2" : registration->namespaces.front();
-        CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
-        CMPIStatus rc = enc::status(CMPI_RC_OK);
-        const LoadingProvider loading(&provider);
-        try {
-            loaded.mi = callFactory(factory, kind, &cmpi, ctx, &rc);
-            if (loaded.mi == nullptr) {
-                loaded.error = "provider " + provider + ": factory " + symbol + " returned no interface";
-            }
-        } catch (...) {
-            loaded.error = "provider " + provider + ": factory " + symbol + " failed with an exception";
-        }
+    }
+    if (factory != nullptr) {
+        factoriesRunning[provider] = std::this_thread::get_id();
+        lock.unlock();
+        loaded.mi = callFactory(provider, kind, factory, *registration, &loaded.error);
+        lock.lock();
+        factoriesRunning.erase(provider);
     }
     if (!loaded.error.empty()) report(loaded.error);
     if (error != nullptr) *error = loaded.error;
     interfaces.push_back(loaded);
+    loadEnded.notify_all();
     return loaded.mi;
+}
+
+void *Broker::State::callFactory(const std::string &provider, InterfaceKind kind, void *factory,
+                                 const ProviderRegistration &registration, std::string *error) {
+    const std::string symbol = provider + "_Create_" + kindName(kind) + "MI";
+    RequestScope scope;
+    const std::string nameSpace =
+        registration.namespaces.empty() ? "root/cimv2" : registration.namespaces.front();
+    CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
+    CMPIStatus rc = enc::status(CMPI_RC_OK);
+    const LoadingProvider announced(&provider);
+    try {
+        void *mi = invokeFactory(factory, kind, &cmpi, ctx, &rc);
+        if (mi == nullptr) *error = "provider " + provider + ": factory " + symbol + " returned no interface";
+        return mi;
+    } catch (...) {
+        *error = "provider " + provider + ": factory " + symbol + " failed with an exception";
+    }
+    return nullptr;
 }
 
 CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
@@ -238,7 +261,7 @@ bool Broker::State::deliver(const std::string &nameSpace, const Instance &indica
 void Broker::State::shutdown() {
     std::vector<LoadedInterface> loaded;
     {
-        std::lock_guard<std::recursive_mutex> lock(loadMutex);
+        std::lock_guard<std::mutex> lock(loadMutex);
         if (shutDown) return;
         shutDown = true;
         loaded = interfaces;
@@ -261,7 +284,7 @@ void Broker::State::shutdown() {
         spareContexts.clear();
     }
     ObjectPool::processPool().releaseAll();
-    std::lock_guard<std::recursive_mutex> lock(loadMutex);
+    std::lock_guard<std::mutex> lock(loadMutex);
     for (auto &entry : libraries) {
         if (entry.second.handle != nullptr) dlclose(entry.second.handle);
     }

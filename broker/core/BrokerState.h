@@ -3,7 +3,9 @@
 #pragma once
 
 #include <map>
+#include <condition_variable>
 #include <mutex>
+#include <thread>
 #include <string>
 #include <vector>
 
@@ -36,11 +38,16 @@ struct Broker::State {
     CMPIBroker cmpi{};
     const CMPIContextFT *contextTable;  // of every context made, as the release mode has it
 
-    // Loading may recurse: a provider's initialize can make up-calls that
-    // load other providers on the same thread.
-    std::recursive_mutex loadMutex;
+    // Guards the three below; never held while a factory runs, since a
+    // provider's initialize may wait for its own threads, whose up-calls
+    // load other providers meanwhile.
+    std::mutex loadMutex;
+    std::condition_variable loadEnded;
     std::map<std::string, LoadedLibrary> libraries;  // by location
     std::vector<LoadedInterface> interfaces;         // in the order obtained
+    // Providers whose factory runs now, and on which thread: one factory
+    // call at a time per provider, whatever the kind.
+    std::map<std::string, std::thread::id> factoriesRunning;
 
     std::mutex threadMutex;
     std::vector<std::unique_ptr<ThreadContextState>> threadContexts;
@@ -55,6 +62,9 @@ struct Broker::State {
 
     void report(const std::string &text) const;
     void *obtain(const std::string &provider, InterfaceKind kind, std::string *error);
+    // The factory call of obtain, with the loading lock released.
+    void *callFactory(const std::string &provider, InterfaceKind kind, void *factory,
+                      const ProviderRegistration &registration, std::string *error);
     LoadedLibrary &library(const std::string &location);
     CMPIContext *prepareThreadContext(const EncContext &from);
     // Runs one provider call in a request scope of its own.

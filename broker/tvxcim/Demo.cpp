@@ -58,12 +58,12 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
 // on before each request: with both streams in one file, a provider's line
 // then never lands inside one of the demo's.
 void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
-    // Every provider is loaded first, as on a broker that has served for a
-    // while: those with polling threads have then polled by the time their
-    // classes are shown.
+    // Every instance provider is loaded first, as on a broker that has
+    // served for a while: those with polling threads have then polled by the
+    // time their classes are shown. Indication providers are loaded by their
+    // subscriptions, so that the first indication is one the demo receives.
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
-        if (registration.indication) broker.managementInterface(registration.providerName, InterfaceKind::Indication);
     }
     std::set<std::string> shown;
     std::vector<ObjectPath> firstOfEachClass;

@@ -1,7 +1,11 @@
 // The broker's two ways of letting an attached provider thread give its
 // objects back, as the host's broker and stock sfcb 1.3 offer them, and the
 // record of which providers start threads while being loaded.
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
+
+#include <algorithm>
+#include <set>
 
 #include <cstddef>
 #include <functional>
@@ -168,19 +172,37 @@ TEST_F(MarkRelease, AnUnreleasedMarkGoesWhenTheThreadDetaches) {
     });
 }
 
-TEST(ThreadedProviders, AreThoseThatPrepareAThreadContextWhileBeingLoaded) {
+// sfcb gives providers of different groups different processes, each with
+// its own copy of the library's static state, and may unload a provider
+// that idles. Every provider of the library is loaded here as sfcb would
+// load it; whichever starts a thread must never be unloaded, and all of them
+// name one group, so whatever state two of them share stays shared.
+TEST(ProductRegistration, KeepsSharedStateInOneProcessAndThreadedProvidersLoaded) {
     Broker broker{loadBrokerConfig({TVX_PROVIDER_DIR}, {TVX_PROVIDER_REG}, {TVX_PRODUCT_MOFS})};
-    const struct {
-        const char *provider;
-        InterfaceKind kind;
-    } loaded[] = {{"TalvexProcessorProvider", InterfaceKind::Instance},
-                  {"Talvex_CIMHeartbeat", InterfaceKind::Indication},
-                  {"EthernetPortProvider", InterfaceKind::Association}};
-    for (const auto &provider : loaded) {
-        std::string error;
-        EXPECT_NE(broker.managementInterface(provider.provider, provider.kind, &error), nullptr) << error;
+    std::set<std::string> groups;
+    for (const ProviderRegistration &registration : broker.registrations()) {
+        groups.insert(registration.group);
+        const struct {
+            bool served;
+            InterfaceKind kind;
+        } kinds[] = {{registration.instance, InterfaceKind::Instance},
+                     {registration.association, InterfaceKind::Association},
+                     {registration.indication, InterfaceKind::Indication}};
+        for (const auto &kind : kinds) {
+            std::string error;
+            if (kind.served) {
+                EXPECT_NE(broker.managementInterface(registration.providerName, kind.kind, &error), nullptr) << error;
+            }
+        }
     }
-    EXPECT_EQ(broker.threadedProviders(), std::vector<std::string>{"Talvex_CIMHeartbeat"});
+    EXPECT_EQ(groups.size(), 1u);
+    EXPECT_NE(*groups.begin(), "");
+    const std::vector<std::string> threaded = broker.threadedProviders();
+    EXPECT_THAT(threaded, testing::IsSupersetOf({"Talvex_CIMHeartbeat", "Talvex_LatchedHealthState"}));
+    for (const ProviderRegistration &registration : broker.registrations()) {
+        const bool starts = std::find(threaded.begin(), threaded.end(), registration.providerName) != threaded.end();
+        EXPECT_TRUE(!starts || registration.unloadNever) << registration.className;
+    }
     broker.shutdown();
 }
 

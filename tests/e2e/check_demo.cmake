@@ -46,6 +46,9 @@ set(expected
   "instance of CIM_PhysicalMemory\n[^}]*Tag = \"DIMM_A1\";\n    HealthState = 15;"
   "== ain root/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\"\nroot/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EPFirmwareSoftwareIdentity"
   "== ain root/cimv2:Talvex_EPDriverSoftwareIdentity[^\n]*\nroot/cimv2:Talvex_EthernetPort[^\n]*DeviceID=\"vmnic0\""
+  "instance of Talvex_LatchedHealthState\n[^}]*LatchedClassName = \"Talvex_DiskDrive\";[^}]*HealthState = 20;"
+  "instance of Talvex_RollupHealthState\n[^}]*HealthState = 20;"
+  "== ain root/cimv2:Talvex_LatchedHealthState.EventId=\"0\"\nroot/cimv2:CIM_Sensor[^\n]*DeviceID=\"fan1\""
   "== ain root/cimv2:OMC_UnitaryComputerSystem[^\n]*\nroot/cimv2:Talvex_HypervisorSoftwareIdentity.InstanceID=\"Talvex Corlai 5.1.0 build-1483097\"\n\n")
 foreach(pattern IN LISTS expected)
   if(NOT shown MATCHES "${pattern}")
