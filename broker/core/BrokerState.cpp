@@ -5,6 +5,8 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <functional>
+#include <memory>
 
 #include "core/EncSupport.h"
 #include "model/InstanceOfClass.h"
@@ -215,17 +217,44 @@ CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
     return handle;
 }
 
+bool Broker::State::enterCall(void *mi, bool cleanup) {
+    std::unique_lock<std::mutex> lock(callMutex);
+    if (closed.count(mi) != 0 || (!cleanup && closing.count(mi) != 0)) return false;
+    ++callsInFlight[mi];
+    return true;
+}
+
+void Broker::State::leaveCall(void *mi) {
+    const std::lock_guard<std::mutex> lock(callMutex);
+    --callsInFlight[mi];
+    callEnded.notify_all();
+}
+
+void Broker::State::closeInterface(void *mi, bool closedNow) {
+    std::unique_lock<std::mutex> lock(callMutex);
+    if (closedNow) {
+        closed.insert(mi);
+        return;
+    }
+    // Calls under way end first: a provider's threads may be in an up-call
+    // to the provider about to be cleaned up.
+    closing.insert(mi);
+    callEnded.wait(lock, [&] { return callsInFlight[mi] == 0; });
+}
+
 void Broker::State::callProvider(
     const std::string &provider, InterfaceKind kind, const std::string &nameSpace,
     Response &response,
-    const std::function<CMPIStatus(void *, const CMPIContext *, const CMPIResult *)> &call) {
+    const std::function<CMPIStatus(void *, const CMPIContext *, const CMPIResult *)> &call,
+    bool cleanupCall) {
     std::string error;
     void *mi = obtain(provider, kind, &error);
-    if (mi == nullptr) {
+    if (mi == nullptr || !enterCall(mi, cleanupCall)) {
         response.rc = CMPI_RC_ERR_FAILED;
-        response.message = error;
+        response.message = mi == nullptr ? error : "the broker has shut down";
         return;
     }
+    const std::unique_ptr<void, std::function<void(void *)>> leave(mi, [this](void *done) { leaveCall(done); });
     RequestScope scope;
     CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
     EncResult result;
@@ -268,11 +297,14 @@ void Broker::State::shutdown() {
     }
     for (auto it = loaded.rbegin(); it != loaded.rend(); ++it) {
         if (it->mi == nullptr) continue;
+        closeInterface(it->mi, false);
         Response ignored;
         callProvider(it->provider, it->kind, "root/cimv2", ignored,
                      [&](void *mi, const CMPIContext *ctx, const CMPIResult *) {
                          return cleanupInterface(mi, it->kind, ctx);
-                     });
+                     },
+                     true);
+        closeInterface(it->mi, true);
         if (!ignored.ok()) {
             report("cleanup of provider " + it->provider + " answered " +
                    std::to_string(static_cast<int>(ignored.rc)));

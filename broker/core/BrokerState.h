@@ -5,6 +5,7 @@
 #include <map>
 #include <condition_variable>
 #include <mutex>
+#include <set>
 #include <thread>
 #include <string>
 #include <vector>
@@ -68,10 +69,23 @@ struct Broker::State {
     LoadedLibrary &library(const std::string &location);
     CMPIContext *prepareThreadContext(const EncContext &from);
     // Runs one provider call in a request scope of its own.
+    // A cleanup call still reaches an interface that shutdown is closing.
     void callProvider(const std::string &provider, InterfaceKind kind, const std::string &nameSpace,
                       Response &response,
                       const std::function<CMPIStatus(void *mi, const CMPIContext *ctx,
-                                                     const CMPIResult *rslt)> &call);
+                                                     const CMPIResult *rslt)> &call,
+                      bool cleanupCall = false);
+
+    // Calls to each interface: shutdown refuses new ones to an interface it
+    // closes, waits for those under way, and after its cleanup refuses all.
+    std::mutex callMutex;
+    std::condition_variable callEnded;
+    std::map<void *, int> callsInFlight;
+    std::set<void *> closing;
+    std::set<void *> closed;
+    bool enterCall(void *mi, bool cleanup);
+    void leaveCall(void *mi);
+    void closeInterface(void *mi, bool closedNow);
     bool deliver(const std::string &nameSpace, const Instance &indication);
     void shutdown();
 };
