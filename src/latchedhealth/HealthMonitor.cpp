@@ -9,7 +9,7 @@
 #include "CmpiInstance.h"
 #include "latchedhealth/HealthLatching.h"
 #include "latchedhealth/LatchedHealthState.h"
-#include "platform/ProviderThread.h"
+#include "latchedhealth/PollingThread.h"
 #include "platform/ThreadCycleObjects.h"
 
 namespace TvLatchedHealth {
@@ -81,14 +81,7 @@ void pollWatchedClasses(const CmpiBroker &broker, const CmpiContext &ctx) {
 }
 
 void *HealthMonitorThread(void *startArgs) {
-    const ThreadStartArgs thread = platform::attachProviderThread(startArgs);
-    const OMC::MutexLock lock(healthMutex);
-    ++runningThreads;
-    while (!stopThreads) {
-        pollWatchedClasses(thread.broker, thread.context);
-        platform::waitOnePeriod(healthCondition, healthMutex, kHealthPollSeconds);
-    }
-    --runningThreads;
+    runPollingThread(startArgs, pollWatchedClasses, kHealthPollSeconds);
     return nullptr;
 }
 

@@ -3,7 +3,7 @@
 #include <syslog.h>
 
 #include "latchedhealth/LatchedHealthState.h"
-#include "platform/ProviderThread.h"
+#include "latchedhealth/PollingThread.h"
 #include "platform/ThreadCycleObjects.h"
 
 namespace TvLatchedHealth {
@@ -20,14 +20,7 @@ void kernelIpCycle(const CmpiBroker &broker, const CmpiContext &ctx) {
 }
 
 void *KernelIpMonitorThread(void *startArgs) {
-    const ThreadStartArgs thread = platform::attachProviderThread(startArgs);
-    const OMC::MutexLock lock(healthMutex);
-    ++runningThreads;
-    while (!stopThreads) {
-        kernelIpCycle(thread.broker, thread.context);
-        platform::waitOnePeriod(healthCondition, healthMutex, kKernelIpCycleSeconds);
-    }
-    --runningThreads;
+    runPollingThread(startArgs, kernelIpCycle, kKernelIpCycleSeconds);
     return nullptr;
 }
 
