@@ -12,9 +12,9 @@
 #include "CmpiBroker.h"
 #include "FigureKeepingReporter.h"
 #include "ScriptedInterfaceAddresses.h"
-#include "cmpi/cmpi_context_ext.h"
 #include "core/Broker.h"
 #include "kernelip/KernelIpIndication.h"
+#include "platform/ThreadCycleObjects.h"
 
 namespace {
 
@@ -58,8 +58,6 @@ void detectionCycle(benchmark::State &state) {
     CmpiBroker cmpi(broker.cmpiBroker());
     const CmpiContext thread = cmpi.prepareAttachThread(CmpiContext(broker.newContext("root/cimv2")));
     cmpi.attachThread(thread);
-    const auto releaseThreadObjects = reinterpret_cast<const CMPIContextExtFT *>(thread.getEnc()->ft)
-                                          ->releaseThreadObjects;
 
     // Every cycle reads the changed list as the current state and the
     // original as the baseline, so each one finds the same change.
@@ -68,8 +66,9 @@ void detectionCycle(benchmark::State &state) {
     TVX::KernelIpIndication detector(addresses);
     detector.enableIndication();
     for (auto _ : state) {
+        platform::ThreadCycleObjects objects(cmpi, thread);
         detector.testAndSend(thread, &cmpi);
-        releaseThreadObjects(thread.getEnc());
+        objects.release();
     }
     if (delivered != static_cast<std::size_t>(state.iterations())) {
         state.SkipWithError("a cycle did not deliver exactly one indication");

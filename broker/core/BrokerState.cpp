@@ -172,7 +172,7 @@ void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std
     if (factory != nullptr) {
         factoriesRunning[provider] = std::this_thread::get_id();
         lock.unlock();
-        loaded.mi = callFactory(provider, kind, factory, *registration, &loaded.error);
+        loaded.mi = callFactory(provider, kind, factory, symbol, *registration, &loaded.error);
         lock.lock();
         factoriesRunning.erase(provider);
     }
@@ -184,8 +184,8 @@ void *Broker::State::obtain(const std::string &provider, InterfaceKind kind, std
 }
 
 void *Broker::State::callFactory(const std::string &provider, InterfaceKind kind, void *factory,
-                                 const ProviderRegistration &registration, std::string *error) {
-    const std::string symbol = provider + "_Create_" + kindName(kind) + "MI";
+                                 const std::string &symbol, const ProviderRegistration &registration,
+                                 std::string *error) {
     RequestScope scope;
     const std::string nameSpace =
         registration.namespaces.empty() ? "root/cimv2" : registration.namespaces.front();
@@ -218,28 +218,30 @@ CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
 }
 
 bool Broker::State::enterCall(void *mi, bool cleanup) {
-    std::unique_lock<std::mutex> lock(callMutex);
-    if (closed.count(mi) != 0 || (!cleanup && closing.count(mi) != 0)) return false;
-    ++callsInFlight[mi];
+    const std::lock_guard<std::mutex> lock(callMutex);
+    InterfaceCalls &calls = interfaceCalls[mi];
+    if (calls.stage == InterfaceCalls::Closed || (calls.stage == InterfaceCalls::Closing && !cleanup)) return false;
+    ++calls.inFlight;
     return true;
 }
 
 void Broker::State::leaveCall(void *mi) {
     const std::lock_guard<std::mutex> lock(callMutex);
-    --callsInFlight[mi];
+    --interfaceCalls[mi].inFlight;
     callEnded.notify_all();
 }
 
-void Broker::State::closeInterface(void *mi, bool closedNow) {
+void Broker::State::startClosing(void *mi) {
     std::unique_lock<std::mutex> lock(callMutex);
-    if (closedNow) {
-        closed.insert(mi);
-        return;
-    }
-    // Calls under way end first: a provider's threads may be in an up-call
-    // to the provider about to be cleaned up.
-    closing.insert(mi);
-    callEnded.wait(lock, [&] { return callsInFlight[mi] == 0; });
+    InterfaceCalls &calls = interfaceCalls[mi];
+    calls.stage = InterfaceCalls::Closing;
+    // A provider's thread may be in an up-call to this interface.
+    callEnded.wait(lock, [&] { return calls.inFlight == 0; });
+}
+
+void Broker::State::markClosed(void *mi) {
+    const std::lock_guard<std::mutex> lock(callMutex);
+    interfaceCalls[mi].stage = InterfaceCalls::Closed;
 }
 
 void Broker::State::callProvider(
@@ -254,7 +256,11 @@ void Broker::State::callProvider(
         response.message = mi == nullptr ? error : "the broker has shut down";
         return;
     }
-    const std::unique_ptr<void, std::function<void(void *)>> leave(mi, [this](void *done) { leaveCall(done); });
+    struct Leave {
+        State &state;
+        void *mi;
+        ~Leave() { state.leaveCall(mi); }
+    } const leave{*this, mi};
     RequestScope scope;
     CMPIContext *ctx = enc::newContext(contextTable, requestContextEntries(nameSpace));
     EncResult result;
@@ -297,14 +303,14 @@ void Broker::State::shutdown() {
     }
     for (auto it = loaded.rbegin(); it != loaded.rend(); ++it) {
         if (it->mi == nullptr) continue;
-        closeInterface(it->mi, false);
+        startClosing(it->mi);
         Response ignored;
         callProvider(it->provider, it->kind, "root/cimv2", ignored,
                      [&](void *mi, const CMPIContext *ctx, const CMPIResult *) {
                          return cleanupInterface(mi, it->kind, ctx);
                      },
                      true);
-        closeInterface(it->mi, true);
+        markClosed(it->mi);
         if (!ignored.ok()) {
             report("cleanup of provider " + it->provider + " answered " +
                    std::to_string(static_cast<int>(ignored.rc)));

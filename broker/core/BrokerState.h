@@ -5,7 +5,6 @@
 #include <map>
 #include <condition_variable>
 #include <mutex>
-#include <set>
 #include <thread>
 #include <string>
 #include <vector>
@@ -65,7 +64,8 @@ struct Broker::State {
     void *obtain(const std::string &provider, InterfaceKind kind, std::string *error);
     // The factory call of obtain, with the loading lock released.
     void *callFactory(const std::string &provider, InterfaceKind kind, void *factory,
-                      const ProviderRegistration &registration, std::string *error);
+                      const std::string &symbol, const ProviderRegistration &registration,
+                      std::string *error);
     LoadedLibrary &library(const std::string &location);
     CMPIContext *prepareThreadContext(const EncContext &from);
     // Runs one provider call in a request scope of its own.
@@ -78,14 +78,17 @@ struct Broker::State {
 
     // Calls to each interface: shutdown refuses new ones to an interface it
     // closes, waits for those under way, and after its cleanup refuses all.
+    struct InterfaceCalls {
+        enum Stage { Open, Closing, Closed } stage = Open;
+        int inFlight = 0;
+    };
     std::mutex callMutex;
     std::condition_variable callEnded;
-    std::map<void *, int> callsInFlight;
-    std::set<void *> closing;
-    std::set<void *> closed;
+    std::map<void *, InterfaceCalls> interfaceCalls;
     bool enterCall(void *mi, bool cleanup);
     void leaveCall(void *mi);
-    void closeInterface(void *mi, bool closedNow);
+    void startClosing(void *mi);
+    void markClosed(void *mi);
     bool deliver(const std::string &nameSpace, const Instance &indication);
     void shutdown();
 };

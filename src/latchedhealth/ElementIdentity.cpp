@@ -1,25 +1,16 @@
 #include "latchedhealth/ElementIdentity.h"
 
-#include <algorithm>
 #include <cstring>
 #include <utility>
 #include <vector>
 
 #include "CmpiStatus.h"
 #include "CmpiString.h"
+#include "platform/TextKeys.h"
 
 namespace TvLatchedHealth {
 
 namespace {
-
-using KeyPairs = std::vector<std::pair<std::string, std::string>>;
-
-std::string lowerAscii(std::string text) {
-    for (char &c : text) {
-        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
-    }
-    return text;
-}
 
 // Each field carries its length, so no text can pass for a separator.
 void appendField(std::string &identity, const std::string &field) {
@@ -29,9 +20,7 @@ void appendField(std::string &identity, const std::string &field) {
 }
 
 std::string fold(const std::string &className, const std::string &nameSpace,
-                 const std::optional<std::string> &host, KeyPairs keys) {
-    for (auto &key : keys) key.first = lowerAscii(key.first);
-    std::sort(keys.begin(), keys.end());
+                 const std::optional<std::string> &host, const platform::TextKeyList &keys) {
     std::string identity;
     appendField(identity, className);
     appendField(identity, nameSpace);
@@ -55,29 +44,19 @@ std::optional<std::string> elementIdentity(const CmpiObjectPath &element) {
     } catch (const CmpiStatus &) {
         return std::nullopt;  // a record could not say which host it names
     }
-    KeyPairs keys;
-    const unsigned int count = element.getKeyCount();
-    for (unsigned int index = 0; index < count; ++index) {
-        CmpiString name;
-        const CmpiData value = element.getKey(index, &name);
-        if (value.isNullValue() || value.isNotFound() ||
-            (value.type() != CMPI_string && value.type() != CMPI_chars)) {
-            return std::nullopt;
-        }
-        keys.emplace_back(textOf(name), textOf(CmpiString(value)));
-    }
+    const std::optional<platform::TextKeyList> keys = platform::textKeysOf(element, true);
+    if (!keys) return std::nullopt;
     std::optional<std::string> hostText;
     if (!host.isNull()) hostText = host.charPtr();
-    return fold(textOf(element.getClassName()), textOf(element.getNameSpace()), hostText,
-                std::move(keys));
+    return fold(textOf(element.getClassName()), textOf(element.getNameSpace()), hostText, *keys);
 }
 
 std::string recordIdentity(const HealthInfo &record) {
-    KeyPairs keys;
+    platform::TextKeyList keys;
     for (const HealthKey &key : record.keys) keys.emplace_back(key.keyName, key.keyValue);
     std::optional<std::string> host;
     if (std::strncmp(record.hostName, "NULL", 4) != 0) host = record.hostName;
-    return fold(record.className, record.nameSpace, host, std::move(keys));
+    return fold(record.className, record.nameSpace, host, platform::normalizedKeys(std::move(keys)));
 }
 
 }  // namespace TvLatchedHealth

@@ -26,6 +26,26 @@ Served servedClass(const CmpiObjectPath &path) {
 
 CmpiStatus invalidClass(CMPIrc rc) { return CmpiStatus(rc, "invalid class name"); }
 
+// Both enumerations: every record in list order under the lock, with the end
+// of results only after at least one; or the one rollup.
+template <class EachRecord, class Rollup>
+CmpiStatus enumerate(const CmpiObjectPath &cop, CmpiResult &rslt, EachRecord eachRecord, Rollup rollup) {
+    switch (servedClass(cop)) {
+    case Served::Latched: {
+        const OMC::MutexLock lock(healthMutex);
+        for (const auto &record : healthList) eachRecord(*record);
+        if (!healthList.empty()) rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    }
+    case Served::Rollup:
+        rollup();
+        rslt.returnDone();
+        return CmpiStatus(CMPI_RC_OK);
+    case Served::Other: break;
+    }
+    return invalidClass(CMPI_RC_ERR_FAILED);
+}
+
 // Without its threads the subsystem would silently report nothing, so a
 // thread that cannot be created stops the process.
 void startThread(pthread_t &handle, platform::ThreadEntry entry, const CmpiBroker &broker,
@@ -45,38 +65,16 @@ TvLatchedHealthState::~TvLatchedHealthState() = default;
 
 CmpiStatus TvLatchedHealthState::enumInstanceNames(const CmpiContext &, CmpiResult &rslt,
                                                    const CmpiObjectPath &cop) {
-    switch (servedClass(cop)) {
-    case Served::Latched: {
-        const OMC::MutexLock lock(healthMutex);
-        for (const auto &record : healthList) returnHealthName(cop, *record, rslt);
-        if (!healthList.empty()) rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
-    }
-    case Served::Rollup:
-        returnRollupName(cop, rslt);
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
-    case Served::Other: break;
-    }
-    return invalidClass(CMPI_RC_ERR_FAILED);
+    return enumerate(
+        cop, rslt, [&](const HealthInfo &record) { returnHealthName(cop, record, rslt); },
+        [&] { returnRollupName(cop, rslt); });
 }
 
 CmpiStatus TvLatchedHealthState::enumInstances(const CmpiContext &, CmpiResult &rslt,
                                                const CmpiObjectPath &cop, const char **properties) {
-    switch (servedClass(cop)) {
-    case Served::Latched: {
-        const OMC::MutexLock lock(healthMutex);
-        for (const auto &record : healthList) returnHealthInstance(cop, properties, *record, rslt);
-        if (!healthList.empty()) rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
-    }
-    case Served::Rollup:
-        returnRollupInstance(cop, properties, rslt);
-        rslt.returnDone();
-        return CmpiStatus(CMPI_RC_OK);
-    case Served::Other: break;
-    }
-    return invalidClass(CMPI_RC_ERR_FAILED);
+    return enumerate(
+        cop, rslt, [&](const HealthInfo &record) { returnHealthInstance(cop, properties, record, rslt); },
+        [&] { returnRollupInstance(cop, properties, rslt); });
 }
 
 CmpiStatus TvLatchedHealthState::getInstance(const CmpiContext &, CmpiResult &rslt,

@@ -9,33 +9,19 @@
 #include "CmpiStatus.h"
 #include "platform/OmcObjectIdentity.h"
 #include "platform/OmcPropertyNames.h"
+#include "platform/TextKeys.h"
 
 namespace OMC {
 
 namespace {
 
-std::string lowered(const char *text) {
-    std::string out = text != nullptr ? text : "";
-    std::transform(out.begin(), out.end(), out.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return out;
-}
-
 // The string keys of a path, names lowered and sorted. Paths that name the
 // same object (sameObject) have the same text keys, so this buckets them
 // and sameObject decides within a bucket.
 std::string textKeySignature(const CmpiObjectPath &path) {
-    std::vector<std::pair<std::string, std::string>> keys;
-    for (unsigned int index = 0, count = path.getKeyCount(); index < count; ++index) {
-        CmpiString name;
-        const CmpiData value = path.getKey(index, &name);
-        if (value.type() == CMPI_string && !value.isNullValue()) {
-            keys.emplace_back(lowered(name.charPtr()), static_cast<const char *>(value));
-        }
-    }
-    std::sort(keys.begin(), keys.end());
+    const std::optional<platform::TextKeyList> keys = platform::textKeysOf(path, false);
     std::string signature;
-    for (const auto &key : keys) signature += key.first + '\0' + key.second + '\0';
+    for (const auto &key : *keys) signature += key.first + '\0' + key.second + '\0';
     return signature;
 }
 
