@@ -296,9 +296,12 @@ bool Broker::State::deliver(const std::string &nameSpace, const Instance &indica
 void Broker::State::shutdown() {
     std::vector<LoadedInterface> loaded;
     {
-        std::lock_guard<std::mutex> lock(loadMutex);
+        std::unique_lock<std::mutex> lock(loadMutex);
         if (shutDown) return;
         shutDown = true;
+        // A factory running now (say for a provider thread's up-call) still
+        // gets its interface listed, and so cleaned up.
+        loadEnded.wait(lock, [&] { return factoriesRunning.empty(); });
         loaded = interfaces;
     }
     for (auto it = loaded.rbegin(); it != loaded.rend(); ++it) {
