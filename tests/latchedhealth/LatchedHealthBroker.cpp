@@ -17,17 +17,6 @@ bool linkedInProvider(const std::string &provider) {
 
 }  // namespace
 
-std::string element(const std::string &cls, const std::string &deviceId,
-                    const std::string &healthStates, const std::string &extra) {
-    return R"({"class": ")" + cls + R"(", "hostName": "esx1", "keys": [{"name": "CreationClassName", "value": ")" +
-           cls + R"("}, {"name": "DeviceID", "value": ")" + deviceId + R"("}], "healthStates": )" +
-           healthStates + extra + "}";
-}
-
-std::string profileWith(const std::string &elements) {
-    return R"({"hostType": "Corlai", "watchedElements": [)" + elements + "]}";
-}
-
 BrokerConfig LatchedHealthBroker::linkedInConfig() {
     BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR, TVX_HOST_PROVIDER_DIR},
                                            {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
@@ -53,8 +42,6 @@ void LatchedHealthBroker::start(BrokerConfig config) {
     threadContext = mb.prepareAttachThread(CmpiContext(broker->newContext(kNs)));
     mb.attachThread(threadContext);
 }
-
-void LatchedHealthBroker::SetUp() { start(linkedInConfig()); }
 
 void LatchedHealthBroker::stop() {
     CmpiBroker(broker->cmpiBroker()).detachThread(threadContext);
@@ -88,16 +75,6 @@ std::vector<TvLatchedHealth::HealthInfo> LatchedHealthBroker::recordsOf(const st
     return found;
 }
 
-std::optional<TvLatchedHealth::HealthInfo> LatchedHealthBroker::recordOf(const std::string &deviceId) {
-    std::vector<TvLatchedHealth::HealthInfo> found = recordsOf(deviceId);
-    if (found.empty()) return std::nullopt;
-    return found.front();
-}
-
 std::uint16_t LatchedHealthBroker::rollup() { return TvLatchedHealth::rollupHealthState.load(); }
-
-ObjectPath LatchedHealthBroker::recordPath(const std::string &eventId, const std::string &cls) {
-    return ObjectPath{"", kNs, cls, {{"EventId", CimValue::makeString(eventId)}}};
-}
 
 }  // namespace latchedtest

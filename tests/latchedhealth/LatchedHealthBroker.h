@@ -29,14 +29,21 @@ inline constexpr const char *kLongSensorClass =
     "Test_SensorWithAClassNameThatIsLongerThanWhatALatchedHealthRecordCanKeepInItsFld";
 
 // One scripted element of the profile's watched elements, as JSON.
-std::string element(const std::string &cls, const std::string &deviceId,
-                    const std::string &healthStates, const std::string &extra = "");
+inline std::string element(const std::string &cls, const std::string &deviceId, const std::string &healthStates,
+                           const std::string &extra = "") {
+    return R"({"class": ")" + cls + R"(", "hostName": "esx1", "keys": [{"name": "CreationClassName", "value": ")" +
+           cls + R"("}, {"name": "DeviceID", "value": ")" + deviceId + R"("}], "healthStates": )" +
+           healthStates + extra + "}";
+}
+
 // A host profile serving `elements` (comma-separated JSON objects).
-std::string profileWith(const std::string &elements);
+inline std::string profileWith(const std::string &elements) {
+    return R"({"hostType": "Corlai", "watchedElements": [)" + elements + "]}";
+}
 
 class LatchedHealthBroker : public testing::Test {
 protected:
-    void SetUp() override;
+    void SetUp() override { start(linkedInConfig()); }
     void TearDown() override;
 
     // The product's and the stand-in's registrations, the latched-health
@@ -48,14 +55,19 @@ protected:
     static void serve(const std::string &profileJson);
     // One whole poll with the health thread's lock held, as the thread runs it.
     void poll();
-    // The records whose elements have this DeviceID key in list order, and
-    // the first of them, copied under the lock.
+    // Copies, taken under the lock, of the records whose elements have this
+    // DeviceID key, in list order.
     static std::vector<TvLatchedHealth::HealthInfo> recordsOf(const std::string &deviceId);
-    static std::optional<TvLatchedHealth::HealthInfo> recordOf(const std::string &deviceId);
+    static std::optional<TvLatchedHealth::HealthInfo> recordOf(const std::string &deviceId) {
+        const auto found = recordsOf(deviceId);
+        return found.empty() ? std::nullopt : std::optional(found.front());
+    }
     static std::uint16_t rollup();
 
     static ObjectPath classPath(const std::string &cls) { return ObjectPath{"", kNs, cls, {}}; }
-    static ObjectPath recordPath(const std::string &eventId, const std::string &cls = "Talvex_LatchedHealthState");
+    static ObjectPath recordPath(const std::string &eventId, const std::string &cls = "Talvex_LatchedHealthState") {
+        return ObjectPath{"", kNs, cls, {{"EventId", CimValue::makeString(eventId)}}};
+    }
 
     std::unique_ptr<Broker> broker;
     CmpiContext threadContext;

@@ -15,10 +15,14 @@ namespace {
 using syslogcapture::LoggedLine;
 using syslogcapture::takeLoggedLines;
 
-LoggedLine err(const std::string &text) { return LoggedLine{LOG_ERR, text}; }
+LoggedLine dropped(const std::string &state, const std::string &cls) {
+    return LoggedLine{LOG_ERR, "Failed to copy object, dropping health state " + state + " for " + cls + "\n"};
+}
 
 using LatchingTest = LatchedHealthBroker;
 
+// An element stays latched at its worst state while the rollup follows the
+// last poll; only an escalation takes a new event number.
 TEST_F(LatchingTest, EscalatesOnlyUpwardsWithNewEventNumbers) {
     serve(profileWith(element("CIM_Sensor", "up", "[10, 5, 20]") + "," +
                       element("Talvex_DiskDrive", "down", "[20, 10]") + "," +
@@ -42,81 +46,51 @@ TEST_F(LatchingTest, EscalatesOnlyUpwardsWithNewEventNumbers) {
     EXPECT_GE(escalated->timestamp, up->timestamp);
     EXPECT_EQ(recordOf("unknown")->healthState, 10);
     EXPECT_NE(recordOf("unknown")->eventId, escalated->eventId);
-    EXPECT_EQ(recordOf("up")->hostName, std::string("esx1"));
-    EXPECT_EQ(recordOf("up")->nameSpace, std::string(kNs));
+    EXPECT_EQ(escalated->hostName, std::string("esx1"));
+    EXPECT_EQ(escalated->nameSpace, std::string(kNs));
 }
 
-TEST_F(LatchingTest, RollupOfHealthyAndEmptyPolls) {
-    serve(profileWith(element("CIM_Sensor", "ok1", "[5]") + "," + element("Talvex_Battery", "ok2", "[5]")));
+// null, missing and wrongly typed HealthState values count nowhere; healthy
+// elements count in the rollup only.
+TEST_F(LatchingTest, HealthyIgnoredAndEmptyPolls) {
+    serve(profileWith(element("Talvex_Battery", "ok", "[5]") + "," + element("CIM_Sensor", "null", "[null]") + "," +
+                      element("CIM_Sensor", "missing", R"(["missing"])") + "," + element("CIM_Sensor", "text", R"(["25"])") +
+                      "," + element("CIM_Sensor", "wide", "[70000]") + "," + element("CIM_Sensor", "flag", "[true]")));
     poll();
     EXPECT_EQ(rollup(), 5);
-    EXPECT_FALSE(recordOf("ok1") || recordOf("ok2"));
+    for (const char *id : {"ok", "null", "missing", "text", "wide", "flag"}) EXPECT_FALSE(recordOf(id)) << id;
     serve(profileWith(""));
     poll();
     EXPECT_EQ(rollup(), 0);
 }
 
-TEST_F(LatchingTest, RecoveredElementStaysLatchedWhileRollupFallsBack) {
-    serve(profileWith(element("Talvex_Battery", "dimm", "[15, 5]")));
-    poll();
-    EXPECT_EQ(rollup(), 15);
-    poll();
-    EXPECT_EQ(rollup(), 5);
-    EXPECT_EQ(recordOf("dimm")->healthState, 15);
-}
-
-TEST_F(LatchingTest, IgnoredValuesCountNowhere) {
-    // null, missing and wrongly typed HealthState values
-    serve(profileWith(element("CIM_Sensor", "null", "[null]") + "," + element("CIM_Sensor", "missing", R"(["missing"])") +
-                      "," + element("CIM_Sensor", "text", R"(["25"])") + "," + element("CIM_Sensor", "wide", "[70000]") +
-                      "," + element("CIM_Sensor", "flag", "[true]")));
-    poll();
-    EXPECT_EQ(rollup(), 0);
-    for (const char *id : {"null", "missing", "text", "wide", "flag"}) EXPECT_FALSE(recordOf(id)) << id;
-}
-
-TEST_F(LatchingTest, UncopyableElementsAreDroppedEveryPollAndUseEventNumbers) {
+// A record that would rebuild another path is dropped, not kept wrong, at
+// every poll; a missing host name is recorded as "NULL".
+TEST_F(LatchingTest, ElementsARecordCannotHoldAreDroppedEveryPoll) {
     serve(profileWith(R"({"class": "CIM_Sensor", "keys": [], "healthStates": [10]},)"
-                      R"({"class": "Talvex_Battery", "keys": [{"name": "DeviceID", "value": 7}], "healthStates": [20]},)" +
-                      element("CIM_Sensor", "before", "[10]") + "," + element("CIM_Sensor", "after", "[10]")));
-    takeLoggedLines();
-    poll();
-    poll();
-    const std::vector<LoggedLine> dropped = {
-        err("Failed to copy object, dropping health state 10 for CIM_Sensor\n"),
-        err("Talvex_Battery has a non string key, this in not supported\n"),
-        err("Failed to copy object, dropping health state 20 for Talvex_Battery\n")};
-    std::vector<LoggedLine> twice = dropped;
-    twice.insert(twice.end(), dropped.begin(), dropped.end());
-    EXPECT_EQ(takeLoggedLines(), twice);
-    // The keyless element took the number between no record and "before".
-    EXPECT_EQ(recordOf("after")->eventId, recordOf("before")->eventId + 1);
-}
-
-TEST_F(LatchingTest, HostNamesAndLongTextsAsRecordedOrDropped) {
-    const std::string longHost(80, 'h');
-    serve(profileWith(R"({"class": "CIM_Sensor", "keys": [{"name": "DeviceID", "value": "nohost"}], "healthStates": [10]},)" +
+                      R"({"class": "Talvex_Battery", "keys": [{"name": "DeviceID", "value": 7}], "healthStates": [20]},)"
+                      R"({"class": "CIM_Sensor", "keys": [{"name": "DeviceID", "value": "nohost"}], "healthStates": [10]},)" +
                       element("CIM_Sensor", "nullhost", "[10]", R"(, "hostName": "NULL")") + "," +
-                      element("CIM_Sensor", "longhost", "[10]", R"(, "hostName": ")" + longHost + "\"") + "," +
-                      element("CIM_Sensor", "longns", "[10]", R"(, "namespace": "root/a-namespace-of-forty-characters-xx")")));
+                      element("CIM_Sensor", "longhost", "[10]", R"(, "hostName": ")" + std::string(80, 'h') + "\"") + "," +
+                      element("CIM_Sensor", "longns", "[10]", R"(, "namespace": "root/a-namespace-of-forty-characters-xx")") +
+                      "," + element(kLongSensorClass, "longclass", "[10]") + "," + element("CIM_Sensor", "after", "[10]")));
     takeLoggedLines();
     poll();
+    poll();
+    const std::vector<LoggedLine> each = {
+        dropped("10", "CIM_Sensor"), dropped("10", "CIM_Sensor"), dropped("10", "CIM_Sensor"), dropped("10", "CIM_Sensor"),
+        dropped("10", std::string(kLongSensorClass).substr(0, 79)),
+        LoggedLine{LOG_ERR, "Talvex_Battery has a non string key, this in not supported\n"},
+        dropped("20", "Talvex_Battery")};
+    std::vector<LoggedLine> twice = each;
+    twice.insert(twice.end(), each.begin(), each.end());
+    EXPECT_EQ(takeLoggedLines(), twice);
     ASSERT_TRUE(recordOf("nohost"));
     EXPECT_EQ(recordOf("nohost")->hostName, std::string("NULL"));
-    // A record that would rebuild another path is dropped, not kept wrong.
-    for (const char *id : {"nullhost", "longhost", "longns"}) EXPECT_FALSE(recordOf(id)) << id;
-    EXPECT_THAT(takeLoggedLines(), testing::Each(err("Failed to copy object, dropping health state 10 for CIM_Sensor\n")));
-}
-
-TEST_F(LatchingTest, ClassTooLongForARecordIsDropped) {
-    serve(profileWith(element(kLongSensorClass, "longclass", "[10]")));
-    takeLoggedLines();
-    poll();
-    EXPECT_FALSE(recordOf("longclass"));
-    EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{err(
-                                     "Failed to copy object, dropping health state 10 for " +
-                                     std::string(kLongSensorClass).substr(0, 79) + "\n")}));
-    EXPECT_EQ(rollup(), 10);
+    for (const char *id : {"nullhost", "longhost", "longns", "longclass"}) EXPECT_FALSE(recordOf(id)) << id;
+    // The dropped elements between them took event numbers.
+    EXPECT_EQ(recordOf("after")->eventId, recordOf("nohost")->eventId + 4);
+    EXPECT_EQ(rollup(), 20);
 }
 
 TEST_F(LatchingTest, ClassNobodyServesIsPassedOver) {

@@ -2,12 +2,10 @@
 // let a provider rebuild the source path instead of copying it.
 #include <gtest/gtest.h>
 
-#include <cstdint>
 #include <utility>
 #include <vector>
 
 #include "CmpiBroker.h"
-#include "CmpiDateTime.h"
 #include "core/Broker.h"
 #include "platform/OmcObjectIdentity.h"
 
@@ -41,19 +39,13 @@ TEST(OmcObjectIdentity, PathsNameTheSameObjectByClassAndKeyValues) {
     // Each case is compared both ways round, so a subclass is also its superclass's case.
     const Case cases[] = {
         {"namespace ignored", alphaInNamespace, alpha, true},
-        {"class name case ignored", path(nullptr, "TEST_SYSTEM", {{"name", "alpha"}}), alpha, true},
+        {"class and key names in any case", path(nullptr, "TEST_SYSTEM", {{"name", "alpha"}}), alpha, true},
         {"subclass", path(nullptr, "Test_Disk", {{"DeviceID", "d"}}), path(nullptr, "Test_Device", {{"DeviceID", "d"}}),
          true},
         {"unrelated class", path(nullptr, "Test_Device", {{"Name", "alpha"}}), alpha, false},
         {"class unknown to the broker", path(nullptr, "Nowhere", {{"Name", "alpha"}}), alpha, false},
         {"text differs in case", system({{"Name", "Alpha"}}), alpha, false},
         {"extra key", system({{"Name", "alpha"}, {"Rack", "1"}}), alpha, false},
-        {"other key name", system({{"Label", "alpha"}}), alpha, false},
-        {"integer widths", system({{"Id", CMPIUint16(7)}}), system({{"Id", CMPIUint64(7)}}), true},
-        {"all bits set, signed and unsigned", system({{"Id", CMPISint64(-1)}}),
-         system({{"Id", CMPIUint64(UINT64_MAX)}}), false},
-        {"integer and its text", system({{"Id", CMPIUint32(7)}}), system({{"Id", "7"}}), false},
-        {"datetimes", system({{"At", CmpiDateTime(5, false)}}), system({{"At", CmpiDateTime(5, true)}}), false},
         {"null keys", system({{"Name", nullText}}), system({{"Name", nullText}}), true},
         {"null and text", system({{"Name", nullText}}), alpha, false},
         {"references to one object", link(alpha), link(alphaInNamespace), true},

@@ -7,8 +7,8 @@
 // eighth context entry.
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstddef>
-#include <functional>
 #include <stdexcept>
 #include <string>
 #include <thread>
@@ -19,27 +19,11 @@
 
 namespace {
 
-using platform::ThreadCycleObjects;
-using tvxbroker::Broker;
-using tvxbroker::BrokerConfig;
 using tvxbroker::ThreadRelease;
-
-constexpr const char *kNs = "root/cimv2";
-
-const struct Mode {
-    const char *name;
-    ThreadRelease release;
-} kModes[] = {{"host's broker", ThreadRelease::ContextEntry}, {"stock sfcb", ThreadRelease::MarkRelease}};
-
-BrokerConfig configFor(ThreadRelease release) {
-    BrokerConfig config;
-    config.threadRelease = release;
-    return config;
-}
 
 // What a polling cycle typically makes: a path, an instance on it, texts.
 void makeCycleObjects(int cycle) {
-    CmpiObjectPath path(kNs, "Test_Polled");
+    CmpiObjectPath path("root/cimv2", "Test_Polled");
     path.setKey("Name", "item-" + std::to_string(cycle));
     CmpiInstance instance(path);
     instance.setProperty("Cycle", static_cast<CMPISint32>(cycle));
@@ -47,55 +31,37 @@ void makeCycleObjects(int cycle) {
     instance.setProperty("Self", instance.getObjectPath());
 }
 
-// Runs `body` on a thread of its own, attached with a context prepared from
-// a request context, as a provider starts its thread.
-void onAttachedThread(Broker &broker, const std::function<void(const CmpiBroker &, const CmpiContext &)> &body) {
-    const CmpiBroker cmpi(broker.cmpiBroker());
-    const CmpiContext threadContext = cmpi.prepareAttachThread(CmpiContext(broker.newContext(kNs)));
-    std::thread thread([&] {
-        cmpi.attachThread(threadContext);
-        body(cmpi, threadContext);
-        cmpi.detachThread(threadContext);
-    });
-    thread.join();
-}
-
-TEST(ThreadCycleObjects, ManyCyclesLeaveAsManyObjectsAsAFew) {
-    for (const Mode &mode : kModes) {
-        SCOPED_TRACE(mode.name);
-        Broker broker{configFor(mode.release)};
-        std::size_t afterTen = 0;
-        std::size_t afterAll = 0;
-        onAttachedThread(broker, [&](const CmpiBroker &cmpi, const CmpiContext &ctx) {
+TEST(ThreadCycleObjects, ManyCyclesEndedEitherWayLeaveAsManyObjectsAsAFew) {
+    for (const ThreadRelease mode : {ThreadRelease::ContextEntry, ThreadRelease::MarkRelease}) {
+        SCOPED_TRACE(mode == ThreadRelease::MarkRelease ? "stock sfcb" : "host's broker");
+        tvxbroker::BrokerConfig config;
+        config.threadRelease = mode;
+        tvxbroker::Broker broker{config};
+        // Only stock sfcb offers the memory table: that is how the library tells them apart.
+        ASSERT_EQ(broker.cmpiBroker()->mft != nullptr, mode == ThreadRelease::MarkRelease);
+        const CmpiBroker cmpi(broker.cmpiBroker());
+        const CmpiContext threadContext = cmpi.prepareAttachThread(CmpiContext(broker.newContext("root/cimv2")));
+        // Sampled after every cycle: on the host's broker the next cycle's
+        // release would hide what a failed one left.
+        std::size_t afterTen = 0, most = 0;
+        std::thread provider([&] {
+            cmpi.attachThread(threadContext);
             for (int cycle = 1; cycle <= 2000; ++cycle) {
-                ThreadCycleObjects objects(cmpi, ctx);
-                makeCycleObjects(cycle);
-                makeCycleObjects(-cycle);
-                objects.release();
+                try {
+                    platform::ThreadCycleObjects objects(cmpi, threadContext);
+                    makeCycleObjects(cycle);
+                    makeCycleObjects(-cycle);
+                    if (cycle % 7 == 0) throw std::runtime_error("the cycle failed");
+                    objects.release();
+                } catch (const std::runtime_error &) {
+                }
                 if (cycle == 10) afterTen = broker.liveObjectCount();
+                if (cycle >= 10) most = std::max(most, broker.liveObjectCount());
             }
-            afterAll = broker.liveObjectCount();
+            cmpi.detachThread(threadContext);
         });
-        EXPECT_EQ(afterAll, afterTen);
-        broker.shutdown();
-    }
-}
-
-TEST(ThreadCycleObjects, ACycleEndedByAnExceptionLeavesNothingBehind) {
-    for (const Mode &mode : kModes) {
-        SCOPED_TRACE(mode.name);
-        Broker broker{configFor(mode.release)};
-        onAttachedThread(broker, [&](const CmpiBroker &cmpi, const CmpiContext &ctx) {
-            const std::size_t before = broker.liveObjectCount();
-            try {
-                ThreadCycleObjects objects(cmpi, ctx);
-                makeCycleObjects(1);
-                EXPECT_GT(broker.liveObjectCount(), before);
-                throw std::runtime_error("the cycle failed");
-            } catch (const std::runtime_error &) {
-            }
-            EXPECT_EQ(broker.liveObjectCount(), before);
-        });
+        provider.join();
+        EXPECT_EQ(most, afterTen);
         broker.shutdown();
     }
 }
