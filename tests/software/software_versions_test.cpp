@@ -1,7 +1,7 @@
 // Where the two images' versions come from, linked in: the boot-bank
 // reader over files the tests write, the version query of the stand-in
-// host with its faults (every syslog line caught), the identity text, the
-// release date and the captured system keys.
+// host with its faults (every syslog line caught), the identity text and
+// the release date.
 #include <gtest/gtest.h>
 #include <syslog.h>
 
@@ -10,7 +10,6 @@
 #include "hostsim/HostSimControl.h"
 #include "software/BootBank.h"
 #include "software/HypervisorVersions.h"
-#include "software/InstalledSystem.h"
 #include "software/InstanceId.h"
 #include "software/SoftwareIdentity.h"
 
@@ -130,13 +129,6 @@ TEST(ReleaseDate, MonthWordsAndDates) {
     for (const char *unparsed : {"", "Jul", "Jul 12", "Jul x 2012", "12 Jul 2012 x", "Jul 12 1950", "Jul 12 10000"}) {
         EXPECT_EQ(releaseDateMicros(unparsed), std::nullopt) << unparsed;
     }
-}
-
-TEST(InstalledSystem, KeysAreCutTo127Characters) {
-    const std::string name(130, 'n');
-    const InstalledSystem system = captureInstalledSystem(name, "OMC_UnitaryComputerSystem");
-    EXPECT_EQ(std::string(system.systemName), name.substr(0, 127));
-    EXPECT_STREQ(system.systemCreationClassName, "OMC_UnitaryComputerSystem");
 }
 
 }  // namespace
