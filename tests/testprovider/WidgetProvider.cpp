@@ -6,7 +6,6 @@
 #include <string>
 
 #include "CmpiArray.h"
-#include "CmpiDateTime.h"
 #include "CmpiProviderFactory.h"
 #include "TestProvider.h"
 
@@ -27,22 +26,17 @@ constexpr Widget kWidgets[] = {
     {"gamma", "Test_SpecialWidget", 3, true},
 };
 
-// 2020-01-01 00:00:00 UTC; a widget was created `size` seconds after it.
-constexpr CMPIUint64 kEpochOfWidgets = 1577836800ULL * 1000000ULL;
-
 CmpiInstance makeWidget(const CmpiString &ns, const Widget &widget, const char **properties) {
     CmpiObjectPath path(ns, widget.className);
     path.setKey("Name", widget.name);
     CmpiInstance inst(path);
     inst.setPropertyFilter(properties, nullptr);
     inst.setProperty("Name", widget.name);
-    inst.setProperty("Caption", std::string("Widget ") + widget.name);
     inst.setProperty("Size", widget.size);
     CmpiArray tags(2, CMPI_string);
     tags[0] = "test";
     tags[1] = widget.name;
     inst.setProperty("Tags", tags);
-    inst.setProperty("Created", CmpiDateTime(kEpochOfWidgets + widget.size * 1000000ULL, false));
     inst.setProperty("Enabled", widget.enabled);
     return inst;
 }
