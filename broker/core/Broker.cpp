@@ -1,5 +1,7 @@
 #include "core/Broker.h"
 
+#include <algorithm>
+
 #include "core/BrokerState.h"
 #include "core/EncSupport.h"
 #include "core/Requests.h"
@@ -140,6 +142,21 @@ const CMPIContext *Broker::newContext(const std::string &nameSpace) {
 std::vector<std::string> Broker::threadedProviders() const {
     std::lock_guard<std::mutex> lock(state->threadMutex);
     return state->threadedProviders;
+}
+
+bool Broker::awaitFirstThreadCycles(std::chrono::milliseconds limit) const {
+    const auto deadline = std::chrono::steady_clock::now() + limit;
+    for (;;) {
+        {
+            std::lock_guard<std::mutex> lock(state->threadMutex);
+            if (std::all_of(state->threadContexts.begin(), state->threadContexts.end(),
+                            [](const auto &thread) { return thread->pool.releaseCount() > 0; })) {
+                return true;
+            }
+        }
+        if (std::chrono::steady_clock::now() >= deadline) return false;
+        std::this_thread::sleep_for(std::chrono::milliseconds(10));
+    }
 }
 
 const ClassSchema &Broker::schema() const { return state->config.schema; }

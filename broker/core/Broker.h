@@ -6,6 +6,8 @@
 // indications to in-process subscribers.
 #pragma once
 
+#include <chrono>
+
 #include <functional>
 #include <memory>
 #include <optional>
@@ -132,6 +134,10 @@ public:
     // The providers that prepared a thread context while being loaded (by
     // their factory or initialize), by registered name, in the order seen.
     std::vector<std::string> threadedProviders() const;
+    // Waits until every provider thread has ended at least one cycle
+    // (released its thread objects, either way) or detached, as on a broker
+    // that has served a while; false if `limit` passed first.
+    bool awaitFirstThreadCycles(std::chrono::milliseconds limit) const;
 
     const ClassSchema &schema() const;
     const std::vector<ProviderRegistration> &registrations() const;

@@ -35,6 +35,7 @@ void ObjectPool::releaseFrom(std::uint64_t sequence) {
         for (auto it = objects.lower_bound(sequence); it != objects.end();) doomed.insert(objects.extract(it++));
     }
     live -= doomed.size();
+    ++releases;
 }
 
 std::size_t ObjectPool::size() const {

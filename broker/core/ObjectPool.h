@@ -38,6 +38,9 @@ public:
     void releaseFrom(std::uint64_t sequence);
     void releaseAll() { releaseFrom(0); }
     std::size_t size() const;
+    // How many times releaseFrom ran: for a thread's pool, the cycles the
+    // thread has ended.
+    std::uint64_t releaseCount() const { return releases.load(); }
 
     // The pool new objects go to on this thread.
     static ObjectPool &current();
@@ -51,6 +54,7 @@ private:
     mutable std::mutex mutex;
     std::map<std::uint64_t, std::unique_ptr<PooledObject>> objects;  // by sequence
     std::uint64_t nextSequence = 0;
+    std::atomic<std::uint64_t> releases{0};
     static std::atomic<std::size_t> live;
 };
 

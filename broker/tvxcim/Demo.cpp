@@ -19,6 +19,7 @@ using tvxbroker::Response;
 namespace {
 
 constexpr double kFirstIndicationSeconds = 10;
+constexpr std::chrono::seconds kFirstCycleLimit{10};
 
 ObjectPath classPath(const std::string &className) { return ObjectPath{"", defaultNameSpace, className, {}}; }
 
@@ -58,13 +59,15 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
 // on before each request: with both streams in one file, a provider's line
 // then never lands inside one of the demo's.
 void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
-    // Every instance provider is loaded first, as on a broker that has
-    // served for a while: those with polling threads have then polled by the
-    // time their classes are shown. Indication providers are loaded by their
-    // subscriptions, so that the first indication is one the demo receives.
+    // Every instance provider is loaded first, and their threads have ended
+    // a first cycle, as on a broker that has served for a while: those that
+    // poll have then polled by the time their classes are shown. Indication
+    // providers are loaded by their subscriptions, so that the first
+    // indication is one the demo receives.
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
     }
+    broker.awaitFirstThreadCycles(kFirstCycleLimit);
     std::set<std::string> shown;
     std::vector<ObjectPath> firstOfEachClass;
     for (const ProviderRegistration &registration : broker.registrations()) {

@@ -11,7 +11,6 @@
 #include <chrono>
 #include <map>
 #include <set>
-#include <thread>
 
 #include "ClientView.h"
 #include "model/MofInstanceText.h"
@@ -95,22 +94,13 @@ TEST(ConsistencySuite, RegistrationsServeInstances) {
 class ServedClass : public testing::TestWithParam<std::string> {
 protected:
     // As a client of a broker that has served a while: every instance
-    // provider loaded and what its threads gather at start gathered, so that
-    // requests in a row see the same objects. A poll holds its own lock, so
-    // names stop changing once it has ended.
+    // provider loaded and its threads past their first cycle, so that
+    // requests in a row see the same objects.
     void SetUp() override {
-        std::vector<std::size_t> before;
-        for (int round = 0; round < 50; ++round) {
-            std::vector<std::size_t> now;
-            for (const ProviderRegistration &registration : broker.registrations()) {
-                if (!registration.instance) continue;
-                const ObjectPath path{"", registration.namespaces.front(), registration.className, {}};
-                now.push_back(broker.enumInstanceNames(path).paths.size());
-            }
-            if (now == before) return;
-            before = now;
-            std::this_thread::sleep_for(std::chrono::milliseconds(200));
+        for (const ProviderRegistration &registration : broker.registrations()) {
+            if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
         }
+        ASSERT_TRUE(broker.awaitFirstThreadCycles(std::chrono::seconds(30)));
     }
 
     // In the first namespace the registration serves the class under test
