@@ -8,6 +8,8 @@ packages=(
   ninja-build
   g++
   g++-multilib
+  clang
+  libclang-rt-14-dev
   googletest
   libgtest-dev
   libgmock-dev

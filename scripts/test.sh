@@ -1,5 +1,6 @@
 #!/usr/bin/env bash
-# Configures, builds and tests every preset; stops at the first failure.
+# Configures, builds and tests every preset, then runs the fuzz targets
+# briefly; stops at the first failure.
 set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
@@ -21,6 +22,11 @@ for preset in "${presets[@]}"; do
   summary+=("${preset} ($((SECONDS - preset_started)) s):")
   summary+=("$(grep -E 'tests passed, [0-9]+ tests failed out of' "$log" | tail -n 1)")
 done
+
+# A smoke run: every fuzz target briefly, and every regression input.
+fuzz_started=$SECONDS
+scripts/fuzz.sh 4 | tee build/fuzz-smoke.log
+summary+=("fuzz ($((SECONDS - fuzz_started)) s): $(grep -c ' ok$' build/fuzz-smoke.log) targets and regression sets ok")
 
 echo "=== summary"
 printf '%s\n' "${summary[@]}"

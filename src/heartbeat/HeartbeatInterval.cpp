@@ -41,6 +41,10 @@ std::int32_t readHeartbeatInterval(const char *path, std::int32_t current) {
         syslog(LOG_ERR, "Open file to read: %s failed, using default: %d seconds", path, current);
         return current;
     }
+    return readHeartbeatInterval(file, current);
+}
+
+std::int32_t readHeartbeatInterval(std::istream &file, std::int32_t current) {
     std::string line;
     bool found = false;
     while (!found && std::getline(file, line)) found = line.find(kKey) != std::string::npos;

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdint>
+#include <istream>
 
 namespace Heartbeat {
 
@@ -14,6 +15,9 @@ inline constexpr const char *kBrokerConfigFile = "/etc/sfcb/sfcb.cfg";
 // counts; its value is the first run of digits before any "#", unless the
 // line begins with that run.
 std::int32_t readHeartbeatInterval(const char *path, std::int32_t current);
+
+// The same for the text of an opened configuration file.
+std::int32_t readHeartbeatInterval(std::istream &file, std::int32_t current);
 
 // Updates heartbeatIntervalSeconds from the broker's configuration file.
 void readHeartbeatInterval();

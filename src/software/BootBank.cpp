@@ -86,8 +86,12 @@ std::string bootBankFileInUse() {
 std::unique_ptr<SystemVersionInfo> readBootBank(const char *path) {
     const std::unique_ptr<std::FILE, FileCloser> file(std::fopen(path, "r"));
     if (!file) return nullptr;
+    return readBootBank(file.get());
+}
+
+std::unique_ptr<SystemVersionInfo> readBootBank(std::FILE *file) {
     auto record = std::make_unique<SystemVersionInfo>();
-    std::optional<std::string> value = firstBuildValue(file.get());
+    std::optional<std::string> value = firstBuildValue(file);
     if (!value) return record;
     removeTrailingSpace(*value);
     const std::size_t hyphen = value->find('-');

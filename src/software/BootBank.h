@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdint>
+#include <cstdio>
 #include <memory>
 #include <string>
 
@@ -24,6 +25,9 @@ std::string bootBankFileInUse();
 // before the first hyphen (cut to its field), the product "Talvex Corlai"
 // and the build number of the text after it.
 std::unique_ptr<SystemVersionInfo> readBootBank(const char *path);
+
+// The record of an opened boot configuration; never null.
+std::unique_ptr<SystemVersionInfo> readBootBank(std::FILE *file);
 
 // The build number of a build text: the number itself, or the third of
 // three joined by dots, each a plain decimal without sign or leading zero

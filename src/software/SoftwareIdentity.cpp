@@ -70,6 +70,13 @@ std::optional<std::uint64_t> releaseDateMicros(const char *text) {
     return static_cast<std::uint64_t>(static_cast<std::int64_t>(seconds) * microsPerSecond);
 }
 
+std::optional<std::uint64_t> recordReleaseDate(const SystemVersionInfo &record) {
+    char releaseDate[sizeof record.releaseDateText + 1];
+    frame::copyBounded(releaseDate, record.releaseDateText, sizeof record.releaseDateText);
+    if (releaseDate[0] == '\0') return std::nullopt;
+    return releaseDateMicros(releaseDate);
+}
+
 std::uint64_t bootTimeMicros() {
     struct sysinfo system {};
     ::sysinfo(&system);
@@ -78,12 +85,8 @@ std::uint64_t bootTimeMicros() {
 }
 
 void fillSoftwareIdentity(CmpiInstance &instance, const SystemVersionInfo &record, std::uint64_t bootTimeMicros) {
-    char releaseDate[sizeof record.releaseDateText + 1];
-    frame::copyBounded(releaseDate, record.releaseDateText, sizeof record.releaseDateText);
-    if (releaseDate[0] != '\0') {
-        if (const std::optional<std::uint64_t> micros = releaseDateMicros(releaseDate)) {
-            instance.setProperty("ReleaseDate", CmpiData(CmpiDateTime(*micros, false)));
-        }
+    if (const std::optional<std::uint64_t> micros = recordReleaseDate(record)) {
+        instance.setProperty("ReleaseDate", CmpiData(CmpiDateTime(*micros, false)));
     }
     const bool running = isRunningImage(record);
     const std::string id = makeInstanceId(record);

@@ -25,6 +25,10 @@ int monthOfWord(const char *word);
 // outside what a CIM datetime point in time can show (1970 to 9999).
 std::optional<std::uint64_t> releaseDateMicros(const char *text);
 
+// The release date of a record: releaseDateMicros of its date text, which
+// need not be terminated within its field; nothing for an empty one.
+std::optional<std::uint64_t> recordReleaseDate(const SystemVersionInfo &record);
+
 // The host's boot time in microseconds since the epoch: now minus uptime.
 std::uint64_t bootTimeMicros();
 

@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 #include <filesystem>
+#include <fstream>
 
 #include "HostSimTesting.h"
 
@@ -39,6 +40,41 @@ TEST_F(HostSimProfiles, GarbledProfilesAreRefusedNamingTheField) {
     serve(host({{{"name", "kept"}}}));
     for (const auto &[json, message] : cases) EXPECT_THAT(loadError(json), StartsWith(message)) << json;
     EXPECT_EQ(adapterNames(), std::vector<std::string>{"kept"}) << "a refused profile replaces nothing";
+}
+
+// Inputs a fuzzer found: numbers beyond a double are refused as the syntax
+// errors are, with their place; an entry's texts are held once however many
+// adapters its count makes, and a name, which every list call hands out for
+// each adapter, is bounded.
+TEST_F(HostSimProfiles, FuzzedProfilesAreRefusedOrServedWithoutBlowingUp) {
+    const std::string texts = std::string(4096, 'x');
+    nlohmann::json amplified = {{"hostType", "Corlai"},
+                                {"adapters", {{{"name", std::string(4096, 'n')}, {"count", 100000}}}}};
+    for (const char *field : {"driverName", "driverVersion", "firmwareVersion", "interfaceName", "mac"}) {
+        amplified["adapters"][0][field] = texts;
+    }
+    const std::pair<std::string, std::string> cases[] = {
+        {R"({"hostType":"Corlai","hostName":1e400})",
+         "not valid JSON: line 1, column 37: number overflow parsing '1e400'"},
+        {R"({"hostType":"Corlai","hostName":-1e999})",
+         "not valid JSON: line 1, column 38: number overflow parsing '-1e999'"},
+        {"{\"hostType\": \"Corlai\",\n \"adapters\": [{\"name\": \"a\",\n\t\"mtu\": 2E+308}]}",
+         "not valid JSON: line 3, column 14: number overflow parsing '2E+308'"},
+        {amplified.dump(), "adapters[0].name: expected a text of at most 255 bytes, got 4096"},
+    };
+    for (const auto &[json, message] : cases) EXPECT_EQ(loadError(json), message) << json.substr(0, 80);
+
+    const std::string path = ::testing::TempDir() + "overflow.json";
+    std::ofstream(path) << cases[0].first;
+    char error[256];
+    EXPECT_NE(HostSim_CheckProfileFile(path.c_str(), error, sizeof error), 0);
+    EXPECT_EQ(error, path + ": " + cases[0].second);
+
+    amplified["adapters"][0]["name"] = "vmnic";
+    serve(amplified);
+    Bytes record(1252);
+    ASSERT_EQ(readNode(72, {std::string("vmnic99999")}, record), 0);
+    EXPECT_EQ(std::string(record.begin(), record.begin() + 32), texts.substr(0, 32));
 }
 
 // Every example profile stays valid, and a file is read as text is.

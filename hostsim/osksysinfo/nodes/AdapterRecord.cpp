@@ -5,10 +5,10 @@
 namespace hostsim {
 
 void encodeAdapterRecord(const AdapterProfile &adapter, unsigned char *record) {
-    putText(record + 0, 32, adapter.driverName);
-    putText(record + 32, 32, adapter.driverVersion);
-    putText(record + 64, 32, adapter.firmwareVersion);
-    putText(record + 128, 32, adapter.interfaceName);
+    putText(record + 0, 32, adapter.texts->driverName);
+    putText(record + 32, 32, adapter.texts->driverVersion);
+    putText(record + 64, 32, adapter.texts->firmwareVersion);
+    putText(record + 128, 32, adapter.texts->interfaceName);
     putUnsigned(record + 160, adapter.capabilities, 4);
     putUnsigned(record + 164, adapter.enabledCapabilities, 4);
     putUnsigned(record + 172, adapter.pciBus, 4);
@@ -19,7 +19,7 @@ void encodeAdapterRecord(const AdapterProfile &adapter, unsigned char *record) {
     putUnsigned(record + 189, adapter.linkUp, 1);
     putUnsigned(record + 190, adapter.speedMbps, 2);
     putUnsigned(record + 192, adapter.fullDuplex, 1);
-    putText(record + 1225, adapterRecordSize - 1225, adapter.mac);
+    putText(record + 1225, adapterRecordSize - 1225, adapter.texts->mac);
 }
 
 }  // namespace hostsim

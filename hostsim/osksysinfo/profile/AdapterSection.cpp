@@ -1,6 +1,7 @@
 // "adapters": the physical network adapters, in instance-list order. An entry
 // with "count" N stands for N adapters named <name>0 ... <name>N-1, so a
-// large host is a few lines of JSON.
+// large host is a few lines of JSON; they share the entry's texts.
+#include <memory>
 #include <string>
 
 #include "profile/FieldReading.h"
@@ -15,13 +16,14 @@ constexpr std::uint64_t mostAdapters = 100000;
 
 AdapterProfile readAdapter(JsonObjectReader &entry) {
     AdapterProfile adapter;
-    auto name = entry.text("name");
+    auto name = readInstanceName(entry, "name");
     if (!name) entry.fail("name", "missing");
     adapter.name = std::move(*name);
-    readText(entry, "driverName", adapter.driverName);
-    readText(entry, "driverVersion", adapter.driverVersion);
-    readText(entry, "firmwareVersion", adapter.firmwareVersion);
-    readText(entry, "interfaceName", adapter.interfaceName);
+    auto texts = std::make_shared<AdapterTexts>();
+    readText(entry, "driverName", texts->driverName);
+    readText(entry, "driverVersion", texts->driverVersion);
+    readText(entry, "firmwareVersion", texts->firmwareVersion);
+    readText(entry, "interfaceName", texts->interfaceName);
     readNumber(entry, "capabilities", adapter.capabilities);
     readNumber(entry, "enabledCapabilities", adapter.enabledCapabilities);
     readNumber(entry, "pciBus", adapter.pciBus);
@@ -32,7 +34,8 @@ AdapterProfile readAdapter(JsonObjectReader &entry) {
     readFlag(entry, "linkUp", adapter.linkUp);
     readNumber(entry, "speedMbps", adapter.speedMbps);
     readFlag(entry, "fullDuplex", adapter.fullDuplex);
-    readText(entry, "mac", adapter.mac);
+    readText(entry, "mac", texts->mac);
+    adapter.texts = std::move(texts);
     readNumber(entry, "mtu", adapter.mtu);
     return adapter;
 }

@@ -19,18 +19,6 @@ namespace {
 constexpr std::uint64_t mostInterfaces = 100000;
 // As written: the entries of a counted interface are shared, not copied.
 constexpr std::size_t mostIpv6Addresses = 100000;
-// Interface and IPv6 instance names; it bounds what one instance list holds.
-constexpr std::size_t longestName = 255;
-
-std::optional<std::string> readName(JsonObjectReader &entry, const char *key) {
-    std::optional<std::string> name = entry.text(key);
-    if (name && name->size() > longestName) {
-        entry.fail(key, "expected a text of at most " + std::to_string(longestName) + " bytes, got " +
-                            std::to_string(name->size()));
-    }
-    return name;
-}
-
 std::optional<Ipv4Bytes> readDottedDecimal(JsonObjectReader &entry, const char *key) {
     const std::optional<std::string> text = entry.text(key);
     if (!text) return std::nullopt;
@@ -57,7 +45,7 @@ void readIpv6(JsonObjectReader &entry, InterfaceProfile &interface, std::size_t 
             throw ProfileError("ipInterfaces: more than " + std::to_string(mostIpv6Addresses) + " IPv6 addresses");
         }
         Ipv6Profile address;
-        address.instance = readName(element, "instance").value_or(std::to_string(interface.ipv6.size()));
+        address.instance = readInstanceName(element, "instance").value_or(std::to_string(interface.ipv6.size()));
         std::optional<std::string> text = element.text("address");
         if (!text) element.fail("address", "missing");
         address.address = std::move(*text);
@@ -77,7 +65,7 @@ void readInterfaces(JsonObjectReader &host, HostProfile &profile) {
     std::size_t ipv6AddressesRead = 0;
     host.eachObject("ipInterfaces", [&profile, &ipv6AddressesRead](JsonObjectReader &entry) {
         auto interface = std::make_unique<InterfaceProfile>();
-        std::optional<std::string> name = readName(entry, "name");
+        std::optional<std::string> name = readInstanceName(entry, "name");
         if (!name) entry.fail("name", "missing");
         interface->name = std::move(*name);
         interface->ipv4 = readIpv4(entry);

@@ -1,24 +1,13 @@
 #include "profile/ProfileReader.h"
 
 #include "profile/JsonObjectReader.h"
+#include "profile/JsonText.h"
 #include "profile/ProfileError.h"
 #include "profile/ProfileSections.h"
 
 namespace hostsim {
 
 namespace {
-
-nlohmann::json parseJson(const std::string &text) {
-    try {
-        return nlohmann::json::parse(text);
-    } catch (const nlohmann::json::parse_error &error) {
-        // Keep "line L, column C: ..." and drop the library's own prefix.
-        std::string reason = error.what();
-        const std::string::size_type at = reason.find("parse error at ");
-        if (at != std::string::npos) reason.erase(0, at + std::string("parse error at ").size());
-        throw ProfileError("not valid JSON: " + reason);
-    }
-}
 
 bool readServiceConsole(JsonObjectReader &host) {
     const std::optional<std::string> type = host.text("hostType");
