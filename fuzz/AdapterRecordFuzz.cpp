@@ -3,10 +3,8 @@
 #include "ethernet/AdapterRecord.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size) {
-    unsigned char record[EthernetProvider::adapterRecordSize];
-    tvxfuzz::fillRecord(record, data, size);
-    EthernetProvider::PnicDetails details{};
-    EthernetProvider::decodeAdapterRecord(record, details);
+    using namespace EthernetProvider;
+    const auto details = tvxfuzz::decodeRecord<adapterRecordSize, PnicDetails>(data, size, decodeAdapterRecord);
     tvxfuzz::requireTerminated(details.driverName);
     tvxfuzz::requireTerminated(details.driverVersion);
     tvxfuzz::requireTerminated(details.firmwareVersion);

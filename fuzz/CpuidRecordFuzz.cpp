@@ -3,10 +3,8 @@
 #include "processor/CpuidRecord.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size) {
-    unsigned char record[Processor::cpuidRecordSize];
-    tvxfuzz::fillRecord(record, data, size);
-    Processor::ProcessorDetails details{};
-    Processor::decodeCpuidRecord(record, details);
+    using namespace Processor;
+    const auto details = tvxfuzz::decodeRecord<cpuidRecordSize, ProcessorDetails>(data, size, decodeCpuidRecord);
     tvxfuzz::requireTerminated(details.stepping);
     return 0;
 }

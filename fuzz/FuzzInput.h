@@ -20,6 +20,16 @@ void fillRecord(Record &record, const std::uint8_t *data, std::size_t size) {
     std::memcpy(&record, data, size < sizeof record ? size : sizeof record);
 }
 
+// What `decode` makes of the input as a record of `width` bytes.
+template <std::size_t width, typename Details, typename Decode>
+Details decodeRecord(const std::uint8_t *data, std::size_t size, Decode decode) {
+    unsigned char record[width];
+    fillRecord(record, data, size);
+    Details details{};
+    decode(record, details);
+    return details;
+}
+
 // A decoded text field must end within its array: the providers hand it on
 // as a C string.
 template <std::size_t width>

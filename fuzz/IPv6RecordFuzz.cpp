@@ -3,10 +3,8 @@
 #include "kernelip/IPv6Record.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size) {
-    unsigned char record[TVX::ipv6RecordSize];
-    tvxfuzz::fillRecord(record, data, size);
-    TVX::endpointDetails endpoint{};
-    TVX::decodeIPv6Record(record, endpoint);
+    using namespace TVX;
+    const auto endpoint = tvxfuzz::decodeRecord<ipv6RecordSize, endpointDetails>(data, size, decodeIPv6Record);
     tvxfuzz::requireTerminated(endpoint.ipv6Address);
     return 0;
 }
