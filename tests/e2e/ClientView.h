@@ -59,4 +59,23 @@ inline std::vector<PropertyDecl> rolesOf(const std::string &associationClass, co
     return roles;
 }
 
+// For each end of the association, the first instance of the class that end
+// refers to (in `nameSpace`) that takes part in one; an end without such an
+// instance adds nothing.
+inline std::vector<ObjectPath> associationStarts(Broker &broker, const std::string &associationClass,
+                                                 const std::string &nameSpace) {
+    std::vector<ObjectPath> starts;
+    for (const PropertyDecl &role : rolesOf(associationClass, broker.schema())) {
+        const Response names = broker.enumInstanceNames(ObjectPath{"", nameSpace, role.referenceClass, {}});
+        for (const ObjectPath &name : names.paths) {
+            const Response associated = broker.associatorNames(name, associationClass, "", "", "");
+            if (associated.ok() && !associated.paths.empty()) {
+                starts.push_back(name);
+                break;
+            }
+        }
+    }
+    return starts;
+}
+
 }  // namespace consistency

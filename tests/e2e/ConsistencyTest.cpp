@@ -196,17 +196,7 @@ protected:
         if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
             GTEST_SKIP() << unavailable->reason;
         }
-        for (const PropertyDecl &role : rolesOf(GetParam(), broker.schema())) {
-            const Response names = broker.enumInstanceNames(classPath(role.referenceClass));
-            ASSERT_TRUE(names.ok()) << role.referenceClass << ": " << describeFailure(names);
-            for (const ObjectPath &name : names.paths) {
-                const Response associated = broker.associatorNames(name, GetParam(), "", "", "");
-                if (associated.ok() && !associated.paths.empty()) {
-                    starts.push_back(name);
-                    break;
-                }
-            }
-        }
+        starts = associationStarts(broker, GetParam(), classPath(GetParam()).nameSpace);
         if (starts.empty()) GTEST_SKIP() << "no instance at either end takes part in " << GetParam();
     }
 
