@@ -96,12 +96,7 @@ protected:
     // As a client of a broker that has served a while: every instance
     // provider loaded and its threads past their first cycle, so that
     // requests in a row see the same objects.
-    void SetUp() override {
-        for (const ProviderRegistration &registration : broker.registrations()) {
-            if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
-        }
-        ASSERT_TRUE(broker.awaitFirstThreadCycles(std::chrono::seconds(30)));
-    }
+    void SetUp() override { ASSERT_TRUE(loadInstanceProviders(broker, std::chrono::seconds(30))); }
 
     // In the first namespace the registration serves the class under test
     // in; the classes at an association's ends are looked for there too.

@@ -181,15 +181,9 @@ json cleanHost() {
 
 class FaultSweep : public testing::TestWithParam<std::string> {
 protected:
-    // As a broker that has served a while: every instance provider loaded
-    // and its threads past their first cycle, so only the request under
-    // test reaches the platform.
-    void SetUp() override {
-        for (const ProviderRegistration &registration : broker.registrations()) {
-            if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
-        }
-        ASSERT_TRUE(broker.awaitFirstThreadCycles(std::chrono::seconds(60)));
-    }
+    // Threads past their first cycle leave the platform to the request
+    // under test.
+    void SetUp() override { ASSERT_TRUE(consistency::loadInstanceProviders(broker, std::chrono::seconds(60))); }
 
     void TearDown() override {
         broker.shutdown();
