@@ -4,8 +4,10 @@
 #pragma once
 
 #include <algorithm>
+#include <chrono>
 #include <set>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include "core/Broker.h"
@@ -57,6 +59,47 @@ inline std::vector<PropertyDecl> rolesOf(const std::string &associationClass, co
         }
     }
     return roles;
+}
+
+// Makes the broker one that has served a while: every instance provider
+// loaded and its threads past their first cycle. A thread may give back its
+// objects more than once a cycle (the health poll does after each class),
+// so the cycle counts as ended once, after every thread's first release,
+// the broker has owned nothing for a while. False if that did not come
+// within `limit`.
+inline bool loadInstanceProviders(Broker &broker, std::chrono::milliseconds limit) {
+    using Clock = std::chrono::steady_clock;
+    constexpr std::chrono::milliseconds quiet(300);
+    const Clock::time_point deadline = Clock::now() + limit;
+    for (const ProviderRegistration &registration : broker.registrations()) {
+        if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
+    }
+    if (!broker.awaitFirstThreadCycles(limit)) return false;
+    for (Clock::time_point quietSince = Clock::now(); Clock::now() - quietSince < quiet;) {
+        if (Clock::now() >= deadline) return false;
+        if (broker.liveObjectCount() != 0) quietSince = Clock::now();
+        std::this_thread::sleep_for(std::chrono::milliseconds(5));
+    }
+    return true;
+}
+
+// For each end of the association, the first instance of the class that end
+// refers to (in `nameSpace`) that takes part in one; an end without such an
+// instance adds nothing.
+inline std::vector<ObjectPath> associationStarts(Broker &broker, const std::string &associationClass,
+                                                 const std::string &nameSpace) {
+    std::vector<ObjectPath> starts;
+    for (const PropertyDecl &role : rolesOf(associationClass, broker.schema())) {
+        const Response names = broker.enumInstanceNames(ObjectPath{"", nameSpace, role.referenceClass, {}});
+        for (const ObjectPath &name : names.paths) {
+            const Response associated = broker.associatorNames(name, associationClass, "", "", "");
+            if (associated.ok() && !associated.paths.empty()) {
+                starts.push_back(name);
+                break;
+            }
+        }
+    }
+    return starts;
 }
 
 }  // namespace consistency

@@ -96,12 +96,7 @@ protected:
     // As a client of a broker that has served a while: every instance
     // provider loaded and its threads past their first cycle, so that
     // requests in a row see the same objects.
-    void SetUp() override {
-        for (const ProviderRegistration &registration : broker.registrations()) {
-            if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
-        }
-        ASSERT_TRUE(broker.awaitFirstThreadCycles(std::chrono::seconds(30)));
-    }
+    void SetUp() override { ASSERT_TRUE(loadInstanceProviders(broker, std::chrono::seconds(30))); }
 
     // In the first namespace the registration serves the class under test
     // in; the classes at an association's ends are looked for there too.
@@ -196,17 +191,7 @@ protected:
         if (const ExpectedException *unavailable = expected(GetParam(), Deviation::ProviderUnavailable)) {
             GTEST_SKIP() << unavailable->reason;
         }
-        for (const PropertyDecl &role : rolesOf(GetParam(), broker.schema())) {
-            const Response names = broker.enumInstanceNames(classPath(role.referenceClass));
-            ASSERT_TRUE(names.ok()) << role.referenceClass << ": " << describeFailure(names);
-            for (const ObjectPath &name : names.paths) {
-                const Response associated = broker.associatorNames(name, GetParam(), "", "", "");
-                if (associated.ok() && !associated.paths.empty()) {
-                    starts.push_back(name);
-                    break;
-                }
-            }
-        }
+        starts = associationStarts(broker, GetParam(), classPath(GetParam()).nameSpace);
         if (starts.empty()) GTEST_SKIP() << "no instance at either end takes part in " << GetParam();
     }
 

@@ -90,6 +90,22 @@ TEST_F(HostSimProfiles, ExampleFilesAreValidAndServed) {
     EXPECT_EQ(HostType_OSIsOSK(), 0);
 }
 
+// A rule counts every call it matches, failed or not, from when its profile
+// was loaded: how a sweep tells whether the nth call was reached.
+TEST_F(HostSimProfiles, FaultRulesCountTheirCallsAndFailOnlyTheNth) {
+    serve(host({{{"name", "vmnic0"}}},
+               {{{"call", "PRB_Get"}, {"node", 74}, {"nth", 2}}, {{"call", "PRB_CheckSig"}, {"nth", 1}}}));
+    Bytes mtu(4);
+    EXPECT_EQ(readNode(74, {std::string("vmnic0")}, mtu), 0);
+    EXPECT_EQ(readNode(74, {std::string("vmnic0")}, mtu), HOSTSIM_STATUS_INJECTED);
+    EXPECT_EQ(readNode(74, {std::string("vmnic0")}, mtu), 0);
+    EXPECT_EQ(HostSim_FaultMatchCount(0), 3u);
+    EXPECT_EQ(HostSim_FaultMatchCount(1), 0u) << "a rule of another call counts nothing";
+    EXPECT_EQ(HostSim_FaultMatchCount(2), 0u) << "past the last rule";
+    serve(host({{{"name", "vmnic0"}}}, {{{"call", "PRB_Get"}, {"node", 74}, {"nth", 2}}}));
+    EXPECT_EQ(HostSim_FaultMatchCount(0), 0u) << "a loaded profile counts from 0";
+}
+
 // The named file is served; one that cannot be read fails every node call
 // and says so once. The demo's test runs on the built-in profile.
 TEST_F(HostSimProfiles, TheEnvironmentNamesTheProfileFile) {

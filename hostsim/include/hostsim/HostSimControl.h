@@ -37,6 +37,12 @@ int HostSim_CheckProfileFile(const char *path, char *error, size_t errorSize);
  * by TVX_HOST_PROFILE, or the built-in default when it is unset or empty. */
 void HostSim_ResetProfile(void);
 
+/* How many calls were counted against the served profile's fault rule at
+ * `rule` (its index in "faults") since the profile was loaded, whether the
+ * rule failed them or not: with "nth" set, whether that call was reached.
+ * 0 for an index past the rules, or when no profile could be read. */
+uint64_t HostSim_FaultMatchCount(size_t rule);
+
 /* The built-in default profile as JSON text (static storage). */
 const char *HostSim_DefaultProfileText(void);
 

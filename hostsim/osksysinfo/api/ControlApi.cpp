@@ -1,4 +1,4 @@
-// The control API: choosing the served profile, and the list counts.
+// The control API: choosing the served profile, its fault counts, and the list counts.
 #include <cstdio>
 #include <cstring>
 #include <exception>
@@ -55,6 +55,10 @@ int HostSim_CheckProfileFile(const char *path, char *error, size_t errorSize) {
 
 void HostSim_ResetProfile(void) {
     ProfileStore::instance().reset();
+}
+
+uint64_t HostSim_FaultMatchCount(size_t rule) {
+    return ProfileStore::instance().matchedCalls(rule);
 }
 
 const char *HostSim_DefaultProfileText(void) {

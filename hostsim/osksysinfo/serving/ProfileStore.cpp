@@ -50,6 +50,11 @@ Consultation ProfileStore::consult(const Call &call) {
     return result;
 }
 
+std::uint64_t ProfileStore::matchedCalls(std::size_t rule) {
+    const std::lock_guard<std::mutex> lock(mutex_);
+    return rule < matchedCalls_.size() ? matchedCalls_[rule] : 0;
+}
+
 void ProfileStore::serve(HostProfile profile) {
     // After the swap `served` holds the old profile, freed once the lock is released.
     std::shared_ptr<const HostProfile> served = std::make_shared<const HostProfile>(std::move(profile));

@@ -34,6 +34,8 @@ public:
     // The current profile, and the fault rule (if any) that fails this call;
     // counts the call against every rule it matches.
     Consultation consult(const Call &call);
+    // Calls counted against the rule at `rule` since the profile was loaded.
+    std::uint64_t matchedCalls(std::size_t rule);
     // The elements of the class. An enumeration is counted as the class's
     // next one and carries its poll; otherwise the last enumerated poll
     // (0 before any) is carried and nothing is counted.
