@@ -144,7 +144,7 @@ std::vector<std::string> Broker::threadedProviders() const {
     return state->threadedProviders;
 }
 
-bool Broker::awaitFirstThreadCycles(std::chrono::milliseconds limit) const {
+bool Broker::awaitFirstThreadReleases(std::chrono::milliseconds limit) const {
     const auto deadline = std::chrono::steady_clock::now() + limit;
     for (;;) {
         {

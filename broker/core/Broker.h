@@ -134,10 +134,10 @@ public:
     // The providers that prepared a thread context while being loaded (by
     // their factory or initialize), by registered name, in the order seen.
     std::vector<std::string> threadedProviders() const;
-    // Waits until every provider thread has ended at least one cycle
-    // (released its thread objects, either way) or detached, as on a broker
-    // that has served a while; false if `limit` passed first.
-    bool awaitFirstThreadCycles(std::chrono::milliseconds limit) const;
+    // Waits until every provider thread has released its thread objects at
+    // least once (either way) or detached: it has then begun its work. False
+    // if `limit` passed first.
+    bool awaitFirstThreadReleases(std::chrono::milliseconds limit) const;
 
     const ClassSchema &schema() const;
     const std::vector<ProviderRegistration> &registrations() const;

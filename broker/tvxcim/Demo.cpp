@@ -19,7 +19,7 @@ using tvxbroker::Response;
 namespace {
 
 constexpr double kFirstIndicationSeconds = 10;
-constexpr std::chrono::seconds kFirstCycleLimit{10};
+constexpr std::chrono::seconds kThreadStartLimit{10};
 
 ObjectPath classPath(const std::string &className) { return ObjectPath{"", defaultNameSpace, className, {}}; }
 
@@ -59,15 +59,15 @@ void showFirstIndication(Broker &broker, const std::string &indicationClass, dou
 // on before each request: with both streams in one file, a provider's line
 // then never lands inside one of the demo's.
 void runDemo(Broker &broker, const CommandLine &line, ResultWriter &writer) {
-    // Every instance provider is loaded first, and their threads have ended
-    // a first cycle, as on a broker that has served for a while: those that
-    // poll have then polled by the time their classes are shown. Indication
-    // providers are loaded by their subscriptions, so that the first
-    // indication is one the demo receives.
+    // Every instance provider is loaded first, and their threads have begun
+    // their first cycle, as on a broker that has served for a while: a
+    // provider whose thread holds its lock for a whole cycle then answers
+    // after that cycle. Indication providers are loaded by their
+    // subscriptions, so that the first indication is one the demo receives.
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
     }
-    broker.awaitFirstThreadCycles(kFirstCycleLimit);
+    broker.awaitFirstThreadReleases(kThreadStartLimit);
     std::set<std::string> shown;
     std::vector<ObjectPath> firstOfEachClass;
     for (const ProviderRegistration &registration : broker.registrations()) {

@@ -7,7 +7,6 @@
 #include <chrono>
 #include <set>
 #include <string>
-#include <thread>
 #include <vector>
 
 #include "core/Broker.h"
@@ -62,23 +61,21 @@ inline std::vector<PropertyDecl> rolesOf(const std::string &associationClass, co
 }
 
 // Makes the broker one that has served a while: every instance provider
-// loaded and its threads past their first cycle. A thread may give back its
-// objects more than once a cycle (the health poll does after each class),
-// so the cycle counts as ended once, after every thread's first release,
-// the broker has owned nothing for a while. False if that did not come
-// within `limit`.
+// loaded and its threads past their first cycle. A thread's first release
+// of its objects means it is inside its first cycle, holding its provider's
+// lock; a request to that provider then waits for the cycle to end. False
+// if the threads did not get that far within `limit`.
 inline bool loadInstanceProviders(Broker &broker, std::chrono::milliseconds limit) {
-    using Clock = std::chrono::steady_clock;
-    constexpr std::chrono::milliseconds quiet(300);
-    const Clock::time_point deadline = Clock::now() + limit;
     for (const ProviderRegistration &registration : broker.registrations()) {
         if (registration.instance) broker.managementInterface(registration.providerName, InterfaceKind::Instance);
     }
-    if (!broker.awaitFirstThreadCycles(limit)) return false;
-    for (Clock::time_point quietSince = Clock::now(); Clock::now() - quietSince < quiet;) {
-        if (Clock::now() >= deadline) return false;
-        if (broker.liveObjectCount() != 0) quietSince = Clock::now();
-        std::this_thread::sleep_for(std::chrono::milliseconds(5));
+    if (!broker.awaitFirstThreadReleases(limit)) return false;
+    const std::vector<std::string> threaded = broker.threadedProviders();
+    for (const ProviderRegistration &registration : broker.registrations()) {
+        if (registration.instance &&
+            std::find(threaded.begin(), threaded.end(), registration.providerName) != threaded.end()) {
+            broker.enumInstanceNames(ObjectPath{"", registration.namespaces.front(), registration.className, {}});
+        }
     }
     return true;
 }
