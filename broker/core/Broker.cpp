@@ -147,16 +147,20 @@ std::vector<std::string> Broker::threadedProviders() const {
 bool Broker::awaitFirstThreadReleases(std::chrono::milliseconds limit) const {
     const auto deadline = std::chrono::steady_clock::now() + limit;
     for (;;) {
-        {
-            std::lock_guard<std::mutex> lock(state->threadMutex);
-            if (std::all_of(state->threadContexts.begin(), state->threadContexts.end(),
-                            [](const auto &thread) { return thread->pool.releaseCount() > 0; })) {
-                return true;
-            }
+        const std::vector<ThreadCycles> threads = threadCycles();
+        if (std::all_of(threads.begin(), threads.end(), [](const ThreadCycles &thread) { return thread.releases > 0; })) {
+            return true;
         }
         if (std::chrono::steady_clock::now() >= deadline) return false;
         std::this_thread::sleep_for(std::chrono::milliseconds(10));
     }
+}
+
+std::vector<ThreadCycles> Broker::threadCycles() const {
+    std::vector<ThreadCycles> threads;
+    std::lock_guard<std::mutex> lock(state->threadMutex);
+    for (const auto &thread : state->threadContexts) threads.push_back({thread->provider, thread->pool.releaseCount()});
+    return threads;
 }
 
 const ClassSchema &Broker::schema() const { return state->config.schema; }

@@ -7,7 +7,7 @@
 #pragma once
 
 #include <chrono>
-
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <optional>
@@ -63,6 +63,14 @@ struct BrokerConfig {
     // a lib<location>.so: a test that links providers in and exports their
     // factories reaches them through the broker like any library.
     std::vector<std::string> inProcessLocations;
+};
+
+// One provider thread's progress: the provider that prepared its context
+// while being loaded (empty for a context prepared otherwise) and how many
+// times the thread has given back its thread objects, either way.
+struct ThreadCycles {
+    std::string provider;
+    std::uint64_t releases = 0;
 };
 
 // Receives each delivered indication; returning false refuses it, and the
@@ -138,6 +146,8 @@ public:
     // least once (either way) or detached: it has then begun its work. False
     // if `limit` passed first.
     bool awaitFirstThreadReleases(std::chrono::milliseconds limit) const;
+    // Every thread context prepared so far, in the order prepared.
+    std::vector<ThreadCycles> threadCycles() const;
 
     const ClassSchema &schema() const;
     const std::vector<ProviderRegistration> &registrations() const;

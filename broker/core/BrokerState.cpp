@@ -210,8 +210,9 @@ CMPIContext *Broker::State::prepareThreadContext(const EncContext &from) {
     std::lock_guard<std::mutex> lock(threadMutex);
     threadContexts.push_back(std::move(thread));
     const std::string *loading = LoadingProvider::name();
-    if (loading != nullptr &&
-        std::find(threadedProviders.begin(), threadedProviders.end(), *loading) == threadedProviders.end()) {
+    if (loading == nullptr) return handle;
+    threadContexts.back()->provider = *loading;
+    if (std::find(threadedProviders.begin(), threadedProviders.end(), *loading) == threadedProviders.end()) {
         threadedProviders.push_back(*loading);
     }
     return handle;

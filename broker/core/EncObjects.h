@@ -75,6 +75,7 @@ struct EncResult : Encapsulated<CMPIResult> {
 struct ThreadContextState {
     std::unique_ptr<EncContext> context;
     ObjectPool pool;
+    std::string provider;  // whose loading prepared it; empty otherwise
 };
 
 namespace enc {

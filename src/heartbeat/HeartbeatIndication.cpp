@@ -6,6 +6,7 @@
 #include <ctime>
 
 #include "CmpiDateTime.h"
+#include "platform/ThreadCycleObjects.h"
 
 namespace Heartbeat {
 namespace {
@@ -19,14 +20,34 @@ std::string hostName() {
 
 }  // namespace
 
-HeartbeatIndication::HeartbeatIndication() : hostname(hostName()) {}
+HeartbeatIndication::HeartbeatIndication(const CmpiBroker &broker, const CmpiContext &threadContext)
+    : hostname(hostName()) {
+    try {
+        const platform::ThreadCycleObjects objects(broker, threadContext);
+        build();
+    } catch (...) {
+        // Logged by the first cycle, which builds it again.
+    }
+}
+
+HeartbeatIndication::~HeartbeatIndication() {
+    try {
+        if (!indication.isNull()) indication.release();
+    } catch (...) {
+        // The broker gives no remedy for a copy it cannot free.
+    }
+}
+
+void HeartbeatIndication::build() {
+    CmpiInstance made(CmpiObjectPath(kHeartbeatNamespace, kHeartbeatClass));
+    made.setProperty("hostname", hostname.c_str());
+    indication = made.clone();
+}
 
 void HeartbeatIndication::beat(const CmpiBroker &broker, const CmpiContext &ctx) {
     try {
-        if (indication.isNull()) {
-            indication = CmpiInstance(CmpiObjectPath(kHeartbeatNamespace, kHeartbeatClass));
-            indication.setProperty("hostname", hostname.c_str());
-        }
+        const platform::ThreadCycleObjects objects(broker, ctx);
+        if (indication.isNull()) build();
         indication.setProperty("stamp", counter++);
         const CMPIUint64 microseconds = static_cast<CMPIUint64>(std::time(nullptr)) * 1000000u;
         indication.setProperty("IndicationTime", CmpiDateTime(microseconds, false));

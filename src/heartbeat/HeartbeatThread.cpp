@@ -8,7 +8,7 @@ namespace Heartbeat {
 
 void *heartBeatThread(void *startArgs) {
     const ThreadStartArgs thread = platform::attachProviderThread(startArgs);
-    HeartbeatIndication heartbeat;
+    HeartbeatIndication heartbeat(thread.broker, thread.context);
     const OMC::MutexLock lock(heartbeatMutex);
     while (!heartbeatStop) {
         heartbeat.beat(thread.broker, thread.context);

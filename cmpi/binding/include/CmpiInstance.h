@@ -20,6 +20,13 @@ public:
     // Properties outside a non-null list are dropped by the broker when set.
     void setPropertyFilter(const char **properties, const char **keys);
 
+    // A copy that belongs to the caller: no release of a thread's objects
+    // frees it, so it can outlive the cycle that made it. It lives until
+    // release().
+    CmpiInstance clone() const;
+    // Frees a copy made by clone(); the instance is null afterwards.
+    void release();
+
     bool isNull() const { return inst == nullptr; }
     CMPIInstance *getEnc() const { return inst; }
 

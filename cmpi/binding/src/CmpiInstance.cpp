@@ -52,3 +52,14 @@ void CmpiInstance::setPropertyFilter(const char **properties, const char **keys)
     CMPIInstance *h = handle();
     cmpiCheck(h->ft->setPropertyFilter(h, properties, keys));
 }
+
+CmpiInstance CmpiInstance::clone() const {
+    CMPIInstance *h = handle();
+    return CmpiInstance(callChecked(h->ft->clone, h));
+}
+
+void CmpiInstance::release() {
+    CMPIInstance *h = handle();
+    inst = nullptr;
+    cmpiCheck(h->ft->release(h));
+}
