@@ -62,28 +62,6 @@ TEST_F(EndpointProvider, EachClassTakesItsRecordsInRecordOrder) {
     EXPECT_EQ(enumerate(kUnserved), std::vector<std::string>{});
 }
 
-// Asked with a parent class's name, in whatever letter case, the provider
-// answers both families in record order, each with its own class.
-TEST_F(EndpointProvider, ParentClassesTakeBothFamiliesInRecordOrder) {
-    serve(host());
-    for (const char *parent : {"Talvex_KernelIPProtocolEndpoint", "cim_ipprotocolendpoint"}) {
-        BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR}, {TVX_PROVIDER_REG}, {TVX_PRODUCT_MOFS, TVX_TEST_MOF});
-        for (ProviderRegistration &registration : config.registrations) {
-            if (registration.providerName == "KernelIPProtocolEndpointProvider") registration.className = parent;
-        }
-        Broker parentBroker(std::move(config));
-        std::vector<std::string> classes;
-        for (const Instance &instance : parentBroker.enumInstances(classPath(parent), {}).instances) {
-            classes.push_back(instance.path.className + " " + instance.property("Name")->text.substr(0, 4));
-        }
-        EXPECT_EQ(classes, (std::vector<std::string>{std::string(kV4) + " vmk0", std::string(kV6) + " vmk0",
-                                                     std::string(kV6) + " vmk0", std::string(kV6) + " vmk1",
-                                                     std::string(kV4) + " vmk2", std::string(kV4) + " vmkx"}))
-            << parent;
-        parentBroker.shutdown();
-    }
-}
-
 TEST_F(EndpointProvider, GetInstanceTakesTheFirstRecordOfItsClassAndName) {
     serve(host());
     const struct {

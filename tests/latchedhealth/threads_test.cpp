@@ -142,26 +142,10 @@ TEST_F(ThreadsTest, RequestsDuringPollsSeeWholePolls) {
     EXPECT_EQ(recordOf("s0")->healthState, 19);
 }
 
-// Detection cycles racing enable and disable, then one that fails: it is
-// logged and the next one runs.
-TEST_F(ThreadsTest, DetectionCyclesSurviveRacesAndFailures) {
+// A detection cycle that fails is logged, and the next one runs.
+TEST_F(ThreadsTest, AFailedDetectionCycleIsLoggedAndTheNextRuns) {
     instanceMI();
     ASSERT_TRUE(eventually([] { return threadsInLoop() == 2; }));
-    std::atomic<bool> racing{true};
-    std::thread switcher([&] {
-        while (racing) {
-            EXPECT_TRUE(broker->enableIndications(kNs, "Talvex_KernelIPChangedIndication").ok());
-            EXPECT_TRUE(broker->disableIndications(kNs, "Talvex_KernelIPChangedIndication").ok());
-        }
-    });
-    for (int cycle = 0; cycle < 50; ++cycle) {
-        wakeThreads();
-        std::this_thread::yield();
-    }
-    racing = false;
-    switcher.join();
-    EXPECT_EQ(threadsInLoop(), 2);
-
     ASSERT_TRUE(broker->enableIndications(kNs, "Talvex_KernelIPChangedIndication").ok());
     syslogcapture::takeLoggedLines();
     addressReadThrows = true;

@@ -98,23 +98,6 @@ TEST_F(VersionSource, AFailingQueryLogsEachTimeAndLeavesOnlyTheDefaults) {
     EXPECT_STREQ(versions.running().releaseDateText, "");
 }
 
-TEST_F(VersionSource, TheBootBankIsReadEachTimeAndKeptWhenItCannotBeOpened) {
-    serve(R"({"hostType": "Corlai"})");
-    std::remove(bootCfg.path.c_str());
-    HypervisorVersions versions(bootCfg.path);
-    versions.gatherVersions();
-    EXPECT_EQ(versions.altBootBank(), nullptr);
-    bootCfg.write("build=5.1.0-1\n");
-    versions.gatherVersions();
-    ASSERT_NE(versions.altBootBank(), nullptr);
-    EXPECT_EQ(versions.altBootBank()->buildNumber, 1);
-    std::remove(bootCfg.path.c_str());
-    versions.gatherVersions();
-    ASSERT_NE(versions.altBootBank(), nullptr);
-    EXPECT_EQ(versions.altBootBank()->buildNumber, 1);
-    EXPECT_TRUE(takeLoggedLines().empty());
-}
-
 TEST(ReleaseDate, MonthWordsAndDates) {
     const std::pair<const char *, int> months[] = {
         {"Mar", 2}, {"Apr", 3}, {"May", 4}, {"Jun", 5}, {"JUL", 6}, {"AuG", 7}, {"Dec", 11},
