@@ -5,7 +5,9 @@
 #include <benchmark/benchmark.h>
 
 #include <map>
+#include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 struct RunFigures {
@@ -31,6 +33,16 @@ public:
     const RunFigures *find(const std::string &name) const {
         const auto found = figures.find(name);
         return found != figures.end() ? &found->second : nullptr;
+    }
+
+    // A counter of two runs, to compare how a cost scales; empty unless
+    // both ran.
+    std::optional<std::pair<double, double>> counterOfBoth(const std::string &small, const std::string &large,
+                                                           const std::string &counter) const {
+        const RunFigures *smallRun = find(small);
+        const RunFigures *largeRun = find(large);
+        if (smallRun == nullptr || largeRun == nullptr) return std::nullopt;
+        return std::make_pair(smallRun->counters.at(counter), largeRun->counters.at(counter));
     }
 
 private:

@@ -88,14 +88,11 @@ BENCHMARK(detectionCycle)->Arg(1024)->Unit(benchmark::kMillisecond);
 int main(int argc, char **argv) {
     FigureKeepingReporter reporter;
     runBenchmarks(argc, argv, reporter);
-    const RunFigures *small = reporter.find("detectionCycle/16");
-    const RunFigures *large = reporter.find("detectionCycle/1024");
-    if (small != nullptr && large != nullptr) {
-        const double smallSeconds = small->counters.at("per_address");
-        const double largeSeconds = large->counters.at("per_address");
+    if (const auto perAddress = reporter.counterOfBoth("detectionCycle/16", "detectionCycle/1024", "per_address")) {
+        const auto [small, large] = *perAddress;
         std::printf("one detection cycle, CPU time per address: %.0f ns on 16 interfaces, %.0f ns on 1,024; "
                     "%.2f times as much on the large host (goal: within 1.3)\n",
-                    smallSeconds * 1e9, largeSeconds * 1e9, largeSeconds / smallSeconds);
+                    small * 1e9, large * 1e9, large / small);
     }
     return 0;
 }

@@ -95,14 +95,11 @@ double cleanupMilliseconds() {
 int main(int argc, char **argv) {
     FigureKeepingReporter reporter;
     runBenchmarks(argc, argv, reporter);
-    const RunFigures *small = reporter.find("poll/100");
-    const RunFigures *large = reporter.find("poll/10000");
-    if (small != nullptr && large != nullptr) {
-        const double smallSeconds = small->counters.at("per_element");
-        const double largeSeconds = large->counters.at("per_element");
+    if (const auto perElement = reporter.counterOfBoth("poll/100", "poll/10000", "per_element")) {
+        const auto [small, large] = *perElement;
         std::printf("one health poll, CPU time per latched element: %.2f us with 100 elements, %.2f us with "
                     "10,000; %.2f times as much (goal: within 1.5)\n",
-                    smallSeconds * 1e6, largeSeconds * 1e6, largeSeconds / smallSeconds);
+                    small * 1e6, large * 1e6, large / small);
     }
     std::printf("terminating cleanup while both threads wait: %.2f ms (goal: under 10 ms)\n", cleanupMilliseconds());
     return 0;

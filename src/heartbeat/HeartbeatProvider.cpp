@@ -10,33 +10,9 @@
 namespace Heartbeat {
 
 HeartbeatProvider::HeartbeatProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-    : CmpiBaseMI(mb, ctx), CmpiIndicationMI(mb, ctx) {}
+    : CmpiBaseMI(mb, ctx), AcceptingIndicationMI(mb, ctx) {}
 
 HeartbeatProvider::~HeartbeatProvider() = default;
-
-CmpiStatus HeartbeatProvider::authorizeFilter(const CmpiContext &, const CmpiSelectExp &,
-                                              const char *, const CmpiObjectPath &, const char *) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus HeartbeatProvider::mustPoll(const CmpiContext &, const CmpiSelectExp &, const char *,
-                                       const CmpiObjectPath &) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus HeartbeatProvider::activateFilter(const CmpiContext &, const CmpiSelectExp &,
-                                             const char *, const CmpiObjectPath &, bool) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus HeartbeatProvider::deActivateFilter(const CmpiContext &, const CmpiSelectExp &,
-                                               const char *, const CmpiObjectPath &, bool) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus HeartbeatProvider::enableIndications(const CmpiContext &) { return CmpiStatus(CMPI_RC_OK); }
-
-CmpiStatus HeartbeatProvider::disableIndications(const CmpiContext &) { return CmpiStatus(CMPI_RC_OK); }
 
 CmpiStatus HeartbeatProvider::initialize(const CmpiContext &ctx) {
     readHeartbeatInterval();

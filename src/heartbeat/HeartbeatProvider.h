@@ -3,28 +3,14 @@
 // receives them, so every indication operation accepts and changes nothing.
 #pragma once
 
-#include "CmpiIndicationMI.h"
+#include "platform/AcceptingIndicationMI.h"
 
 namespace Heartbeat {
 
-class HeartbeatProvider : public CmpiIndicationMI {
+class HeartbeatProvider : public platform::AcceptingIndicationMI {
 public:
     HeartbeatProvider(const CmpiBroker &mb, const CmpiContext &ctx);
     ~HeartbeatProvider() override;
-
-    CmpiStatus authorizeFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                               const char *className, const CmpiObjectPath &op,
-                               const char *owner) override;
-    CmpiStatus mustPoll(const CmpiContext &ctx, const CmpiSelectExp &filter, const char *className,
-                        const CmpiObjectPath &op) override;
-    CmpiStatus activateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                              const char *className, const CmpiObjectPath &op,
-                              bool firstActivation) override;
-    CmpiStatus deActivateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                                const char *className, const CmpiObjectPath &op,
-                                bool lastActivation) override;
-    CmpiStatus enableIndications(const CmpiContext &ctx) override;
-    CmpiStatus disableIndications(const CmpiContext &ctx) override;
 
     // Reads the period and starts the thread, unless it runs or has been
     // stopped; throws CMPI_RC_ERR_FAILED when it cannot be created.

@@ -59,7 +59,7 @@ void startThread(pthread_t &handle, platform::ThreadEntry entry, const CmpiBroke
 }  // namespace
 
 TvLatchedHealthState::TvLatchedHealthState(const CmpiBroker &mb, const CmpiContext &ctx)
-    : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), CmpiIndicationMI(mb, ctx) {}
+    : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx), AcceptingIndicationMI(mb, ctx) {}
 
 TvLatchedHealthState::~TvLatchedHealthState() = default;
 
@@ -126,27 +126,6 @@ CmpiStatus TvLatchedHealthState::cleanup(const CmpiContext &, bool terminating) 
 }
 
 int TvLatchedHealthState::isUnloadable() const { return 0; }
-
-CmpiStatus TvLatchedHealthState::mustPoll(const CmpiContext &, const CmpiSelectExp &, const char *,
-                                          const CmpiObjectPath &) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus TvLatchedHealthState::authorizeFilter(const CmpiContext &, const CmpiSelectExp &,
-                                                 const char *, const CmpiObjectPath &,
-                                                 const char *) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus TvLatchedHealthState::activateFilter(const CmpiContext &, const CmpiSelectExp &,
-                                                const char *, const CmpiObjectPath &, bool) {
-    return CmpiStatus(CMPI_RC_OK);
-}
-
-CmpiStatus TvLatchedHealthState::deActivateFilter(const CmpiContext &, const CmpiSelectExp &,
-                                                  const char *, const CmpiObjectPath &, bool) {
-    return CmpiStatus(CMPI_RC_OK);
-}
 
 CmpiStatus TvLatchedHealthState::enableIndications(const CmpiContext &) {
     kernelIpIndication.enableIndication();

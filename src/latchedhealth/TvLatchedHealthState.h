@@ -4,12 +4,12 @@
 // work on the process-wide records, threads and change detector.
 #pragma once
 
-#include "CmpiIndicationMI.h"
 #include "CmpiInstanceMI.h"
+#include "platform/AcceptingIndicationMI.h"
 
 namespace TvLatchedHealth {
 
-class TvLatchedHealthState : public CmpiInstanceMI, private CmpiIndicationMI {
+class TvLatchedHealthState : public CmpiInstanceMI, private platform::AcceptingIndicationMI {
 public:
     TvLatchedHealthState(const CmpiBroker &mb, const CmpiContext &ctx);
     ~TvLatchedHealthState() override;
@@ -29,19 +29,6 @@ public:
     CmpiStatus cleanup(const CmpiContext &ctx, bool terminating) override;
     int isUnloadable() const override;
 
-    // Filters are not recorded: the detector delivers to the broker, which
-    // decides who receives what.
-    CmpiStatus mustPoll(const CmpiContext &ctx, const CmpiSelectExp &filter, const char *className,
-                        const CmpiObjectPath &op) override;
-    CmpiStatus authorizeFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                               const char *className, const CmpiObjectPath &op,
-                               const char *owner) override;
-    CmpiStatus activateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                              const char *className, const CmpiObjectPath &op,
-                              bool firstActivation) override;
-    CmpiStatus deActivateFilter(const CmpiContext &ctx, const CmpiSelectExp &filter,
-                                const char *className, const CmpiObjectPath &op,
-                                bool lastActivation) override;
     // Switch the kernel IP change detector.
     CmpiStatus enableIndications(const CmpiContext &ctx) override;
     CmpiStatus disableIndications(const CmpiContext &ctx) override;

@@ -12,8 +12,6 @@ using namespace tvxbroker;
 
 namespace {
 
-constexpr const char *kLinkedIn = "linkedin";
-
 // The threads of one subsystem: they share its mutex, which each holds for
 // a whole cycle, and its condition.
 struct Subsystem {
@@ -63,10 +61,8 @@ bool cycleOnce(const Broker &broker, const Subsystem &subsystem, std::chrono::st
 BrokerConfig linkedProductConfig(ThreadRelease release) {
     BrokerConfig config = loadBrokerConfig({TVX_HOST_PROVIDER_DIR}, {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
                                            {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF});
-    for (ProviderRegistration &registration : config.registrations) {
-        if (registration.location == "tvxprovider") registration.location = kLinkedIn;
-    }
-    config.inProcessLocations = {kLinkedIn};
+    // The program links every factory of the library.
+    config.inProcessLocations = {"tvxprovider"};
     config.threadRelease = release;
     return config;
 }
