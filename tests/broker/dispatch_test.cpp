@@ -4,13 +4,16 @@
 // suite's; that a superclass or up-call reaches the providers of subclasses,
 // and a result class its subclasses, the latched-health and association
 // tests of the product's providers show.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
 #include <functional>
 
-#include "BrokerFixture.h"
+#include "core/Broker.h"
 
-namespace brokertest {
 namespace {
 
+using namespace tvxbroker;
 using testing::_;
 using testing::AllOf;
 using testing::HasSubstr;
@@ -18,6 +21,19 @@ using testing::IsEmpty;
 using testing::Matcher;
 using testing::Not;
 using testing::Optional;
+
+constexpr const char *kNs = "root/cimv2";
+
+ObjectPath keyed(const char *cls, const char *key, const std::string &value) {
+    return ObjectPath{"", kNs, cls, {{key, CimValue::makeString(value)}}};
+}
+
+ObjectPath widget(const std::string &name) { return keyed("Test_Widget", "Name", name); }
+
+class BrokerTest : public testing::Test {
+protected:
+    Broker broker{loadBrokerConfig({TVX_TESTPROVIDER_DIR}, {TVX_TESTPROVIDER_REG}, {TVX_TESTPROVIDER_MOF})};
+};
 
 // Asked twice, each request fails the same way.
 TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
@@ -29,7 +45,8 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
         Matcher<std::optional<std::string>> message;
     };
     const Case cases[] = {
-        {"a provider constructor throwing", [&] { return broker.enumInstanceNames(classPath("Test_ThrowingFactory")); },
+        {"a provider constructor throwing",
+         [&] { return broker.enumInstanceNames(ObjectPath{"", kNs, "Test_ThrowingFactory", {}}); },
          CMPI_RC_ERR_FAILED, Optional(AllOf(HasSubstr("ThrowingProvider"), Not(HasSubstr("\n"))))},
         {"createInstance throwing a status", [&] { return broker.createInstance(widget("alpha"), alpha); },
          CMPI_RC_ERR_ALREADY_EXISTS, Optional(std::string("widget exists"))},
@@ -37,7 +54,7 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
          [&] { return broker.setInstance(widget("alpha"), alpha, std::nullopt); }, CMPI_RC_ERR_FAILED,
          Optional(std::string("set failed"))},
         {"execQuery throwing an int",
-         [&] { return broker.execQuery(classPath("Test_Widget"), "SELECT * FROM Test_Widget", "WQL"); },
+         [&] { return broker.execQuery(ObjectPath{"", kNs, "Test_Widget", {}}, "SELECT * FROM Test_Widget", "WQL"); },
          CMPI_RC_ERR_FAILED, Optional(Not(IsEmpty()))},
         {"associatorNames failing in an up-call",
          [&] { return broker.associatorNames(widget("x"), "", "", "", ""); }, CMPI_RC_ERR_NOT_FOUND,
@@ -64,8 +81,8 @@ TEST_F(BrokerTest, EveryStatusReachesTheCallerUnchanged) {
 // provider process dies when the answer is OK with nothing.
 using BrokerDeathTest = BrokerTest;
 TEST_F(BrokerDeathTest, AnUpCallGetInstanceAnsweredOkWithNothingEndsTheProcess) {
-    EXPECT_DEATH(broker.getInstance(gadget("vanishing"), std::nullopt), "answered OK without an instance");
+    EXPECT_DEATH(broker.getInstance(keyed("Test_Gadget", "Id", "gadget-vanishing"), std::nullopt),
+                 "answered OK without an instance");
 }
 
 }  // namespace
-}  // namespace brokertest

@@ -84,9 +84,6 @@ TEST_F(ClassSchemaTest, RecordsPropertiesDefaultsAndKeysBaseFirst) {
     ASSERT_EQ(keys.size(), 2u);
     EXPECT_EQ(keys[0].name, "InstanceID") << "redeclared without Key, still a key";
     EXPECT_EQ(keys[1].name, "Serial");
-    EXPECT_EQ(schema.findProperty("Nope", "InstanceID"), nullptr);
-    EXPECT_FALSE(schema.isA("Nope", "Nope") || schema.isIndication("Nope"));
-    EXPECT_TRUE(schema.selfAndSubclasses("Nope").empty() && schema.keysOf("Nope").empty());
 }
 
 TEST_F(ClassSchemaTest, LoadsAccumulateAndFailedLoadsLeaveNothing) {
@@ -101,12 +98,6 @@ TEST_F(ClassSchemaTest, LoadsAccumulateAndFailedLoadsLeaveNothing) {
     EXPECT_NE(schema.find("TST_A"), nullptr);
 }
 
-std::string loadError(const std::string &text) {
-    ClassSchema schema;
-    schema.loadText("class Known { };", "known.mof");
-    return errorOf([&] { schema.loadText(text, "t.mof"); });
-}
-
 TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
     const std::pair<std::string, std::string> cases[] = {
         {"class A {\n/* never closed", "t.mof:2: unterminated comment"},
@@ -114,7 +105,11 @@ TEST(ClassSchemaErrors, NameOriginLineAndProblem) {
         {std::string("class A {\0};", 12), "t.mof:1: unexpected byte 0x00"},
         {"class A {\n uint16 p = 65536; };", "t.mof:2: default value 65536 of p is out of range for uint16"},
     };
-    for (const auto &c : cases) EXPECT_EQ(loadError(c.first), c.second) << c.first;
+    for (const auto &c : cases) {
+        ClassSchema schema;
+        schema.loadText("class Known { };", "known.mof");
+        EXPECT_EQ(errorOf([&] { schema.loadText(c.first, "t.mof"); }), c.second) << c.first;
+    }
 }
 
 TEST(ClassSchemaErrors, FilesAreNamedInMessages) {

@@ -47,19 +47,6 @@ inline ObjectPath nameOf(const Instance &instance, const ClassSchema &schema) {
     return name;
 }
 
-// The reference properties of an association class, inherited ones
-// included, each once.
-inline std::vector<PropertyDecl> rolesOf(const std::string &associationClass, const ClassSchema &schema) {
-    std::vector<PropertyDecl> roles;
-    std::set<std::string> seen;
-    for (const ClassDecl *decl = schema.find(associationClass); decl != nullptr; decl = schema.find(decl->superclass)) {
-        for (const PropertyDecl &property : decl->properties) {
-            if (property.type == CMPI_ref && seen.insert(toLowerAscii(property.name)).second) roles.push_back(property);
-        }
-    }
-    return roles;
-}
-
 // Makes the broker one that has served a while: every instance provider
 // loaded and its threads past their first cycle. A thread's first release
 // of its objects means it is inside its first cycle, holding its provider's
@@ -86,13 +73,18 @@ inline bool loadInstanceProviders(Broker &broker, std::chrono::milliseconds limi
 inline std::vector<ObjectPath> associationStarts(Broker &broker, const std::string &associationClass,
                                                  const std::string &nameSpace) {
     std::vector<ObjectPath> starts;
-    for (const PropertyDecl &role : rolesOf(associationClass, broker.schema())) {
-        const Response names = broker.enumInstanceNames(ObjectPath{"", nameSpace, role.referenceClass, {}});
-        for (const ObjectPath &name : names.paths) {
-            const Response associated = broker.associatorNames(name, associationClass, "", "", "");
-            if (associated.ok() && !associated.paths.empty()) {
-                starts.push_back(name);
-                break;
+    std::set<std::string> roles;  // inherited ones too, each once
+    for (const ClassDecl *decl = broker.schema().find(associationClass); decl != nullptr;
+         decl = broker.schema().find(decl->superclass)) {
+        for (const PropertyDecl &role : decl->properties) {
+            if (role.type != CMPI_ref || !roles.insert(toLowerAscii(role.name)).second) continue;
+            const Response names = broker.enumInstanceNames(ObjectPath{"", nameSpace, role.referenceClass, {}});
+            for (const ObjectPath &name : names.paths) {
+                const Response associated = broker.associatorNames(name, associationClass, "", "", "");
+                if (associated.ok() && !associated.paths.empty()) {
+                    starts.push_back(name);
+                    break;
+                }
             }
         }
     }

@@ -50,8 +50,6 @@ const ExpectedException expectedExceptions[] = {
     {"Test_NullFactory", Deviation::ProviderUnavailable, "its provider's factory returns no interface"},
     {"Test_ThrowingFactory", Deviation::ProviderUnavailable, "its provider's constructor throws"},
     {"Test_WidgetGadget", Deviation::NoGetInstance, "the links are served by enumeration and traversal only"},
-    {"Test_EventCounter", Deviation::NoGetInstance, "the counter is served by enumeration only"},
-    {"Test_ProviderStats", Deviation::NoGetInstance, "the statistics are served by enumeration only"},
     {"Talvex_EthernetPort", Deviation::PropertyType,
      "AutoSense is a uint16 (1 or 0) where the DMTF class declares a boolean", "AutoSense", CMPI_uint16},
     {"Talvex_KernelIPv6ProtocolEndpoint", Deviation::SharedNames,
@@ -131,8 +129,7 @@ protected:
     void checkNamesOfInstances(const Response &names, const Response &instances) const {
         ASSERT_TRUE(names.ok()) << describeFailure(names);
         ASSERT_TRUE(instances.ok()) << describeFailure(instances);
-        std::vector<std::string> named;
-        std::vector<std::string> enumerated;
+        std::vector<std::string> named, enumerated;
         for (const ObjectPath &path : names.paths) named.push_back(text(path));
         for (const Instance &instance : instances.instances) {
             enumerated.push_back(text(nameOf(instance, broker.schema())));

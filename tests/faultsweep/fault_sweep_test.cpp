@@ -49,20 +49,11 @@ const PlatformCall platformCalls[] = {
 // call made in a loop that never ends gets there.
 constexpr std::uint64_t kRunawayPosition = 100000;
 
-enum class Operation { EnumInstanceNames, EnumInstances, GetInstance, Associators, AssociatorNames, References, ReferenceNames };
+constexpr const char *kBootBank = "TVX_ALTBOOTBANK_CFG";
 
-const char *nameOf(Operation operation) {
-    switch (operation) {
-        case Operation::EnumInstanceNames: return "enumInstanceNames";
-        case Operation::EnumInstances: return "enumInstances";
-        case Operation::GetInstance: return "getInstance";
-        case Operation::Associators: return "associators";
-        case Operation::AssociatorNames: return "associatorNames";
-        case Operation::References: return "references";
-        case Operation::ReferenceNames: return "referenceNames";
-    }
-    return "?";
-}
+enum class Operation { EnumInstanceNames, EnumInstances, GetInstance, Associators, AssociatorNames, References, ReferenceNames };
+const char *const kOperationNames[] = {"enumInstanceNames", "enumInstances", "getInstance", "associators",
+                                       "associatorNames", "references", "referenceNames"};
 
 enum class Outcome {
     Unchanged,  // the clean answer
@@ -157,21 +148,6 @@ void checkAnswer(const Documented &expected, Operation operation, const Response
     }
 }
 
-// Points the boot-bank variable elsewhere for the life of the object.
-class BootBankFile {
-public:
-    explicit BootBankFile(const char *path) : kept_(std::getenv(kVariable) ? std::getenv(kVariable) : "") {
-        ::setenv(kVariable, path, 1);
-    }
-    BootBankFile(const BootBankFile &) = delete;
-    BootBankFile &operator=(const BootBankFile &) = delete;
-    ~BootBankFile() { ::setenv(kVariable, kept_.c_str(), 1); }
-
-private:
-    static constexpr const char *kVariable = "TVX_ALTBOOTBANK_CFG";
-    std::string kept_;
-};
-
 // The built-in host, with no fault.
 json cleanHost() {
     json host = json::parse(HostSim_DefaultProfileText());
@@ -233,16 +209,18 @@ protected:
     // The clean answer, then each call failed at positions 1, 2, ... until
     // a position is not reached, where the answer is the clean one again.
     void sweep(Operation operation, const ObjectPath &path) {
-        SCOPED_TRACE(std::string(nameOf(operation)) + " " + formatPath(path));
+        SCOPED_TRACE(std::string(kOperationNames[int(operation)]) + " " + formatPath(path));
         json host = cleanHost();
         const Response clean = sendOn(host, operation, path);
         ASSERT_TRUE(clean.ok()) << clean.message.value_or("");
         {
             // Every request reads the boot bank afresh; one that cannot be
             // read keeps the record read last.
-            const BootBankFile unreadable("/nonexistent/boot.cfg");
+            const std::string bootBank = std::getenv(kBootBank) != nullptr ? std::getenv(kBootBank) : "";
+            ::setenv(kBootBank, "/nonexistent/boot.cfg", 1);
             SCOPED_TRACE("boot bank unreadable");
             checkAnswer({Outcome::Unchanged}, operation, clean, sendOn(host, operation, path));
+            ::setenv(kBootBank, bootBank.c_str(), 1);
         }
         for (const PlatformCall &call : platformCalls) {
             for (std::uint64_t nth = 1;; ++nth) {

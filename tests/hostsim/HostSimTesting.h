@@ -36,17 +36,10 @@ inline List listOf(const std::vector<Param> &params) {
     return list;
 }
 
-// The instance list of `node` under a parent list holding `parent` (none when empty).
-inline List instanceList(int node, const std::vector<Param> &parent = {}, int *status = nullptr) {
-    const List parentList = parent.empty() ? List() : listOf(parent);
-    PRB_ParamList *list = nullptr;
-    const int result = PRB_GetInstanceListAlloc(node, parentList.get(), &list);
-    if (status != nullptr) *status = result;
-    return List(list);
-}
-
-inline std::vector<std::string> listedNames(int node, const std::vector<Param> &parent = {}) {
-    const List list = instanceList(node, parent);
+inline std::vector<std::string> adapterNames() {
+    PRB_ParamList *listed = nullptr;
+    EXPECT_EQ(PRB_GetInstanceListAlloc(70, nullptr, &listed), 0);
+    const List list(listed);
     std::vector<std::string> names;
     for (int i = 0; i < PRB_ParamListUsedCount(list.get()); ++i) {
         char *name = nullptr;
@@ -56,16 +49,14 @@ inline std::vector<std::string> listedNames(int node, const std::vector<Param> &
     return names;
 }
 
-inline std::vector<std::string> adapterNames() { return listedNames(70); }
-
 inline int readNode(int node, const std::vector<Param> &params, Bytes &buffer) {
     const List list = listOf(params);
     return PRB_Get(node, list.get(), buffer.data(), int(buffer.size()));
 }
 
-// A "Corlai" host. Vectors, since a braced single json would not become an array.
-inline nlohmann::json host(const std::vector<nlohmann::json> &adapters, const std::vector<nlohmann::json> &faults = {}) {
-    return {{"hostType", "Corlai"}, {"adapters", adapters}, {"faults", faults}};
+// A "Corlai" host. A vector, since a braced single json would not become an array.
+inline nlohmann::json host(const std::vector<nlohmann::json> &adapters) {
+    return {{"hostType", "Corlai"}, {"adapters", adapters}};
 }
 
 // The loader's error, empty when the profile was loaded.

@@ -1,6 +1,6 @@
-// The records and instance lists the nodes serve, byte for byte where no
-// decoder test pins the layout. The processor and IP records are read
-// through decoders whose own tests pin the offsets.
+// The adapter record byte for byte: no decoder test pins its layout. The
+// processor and IP records are read through decoders whose own tests pin the
+// offsets, and the kernel IP inventory's tests read the interface nodes.
 #include <algorithm>
 #include <cstring>
 #include <utility>
@@ -56,25 +56,6 @@ TEST_F(HostSimNodes, AdapterRecordCarriesEveryFieldAtItsOffset) {
                   {128, textField(alphabet, 32)}, {160, word(0x11223344)}, {164, word(0x55667788)},
                   {172, word(0x01020304)}, {176, word(0x0A0B0C0D)}, {180, word(7)}, {184, {0x86, 0x80}},
                   {186, {0xfb, 0x10}}, {189, {2}}, {190, {0x10, 0x27}}, {192, {1}}, {1225, textField(alphabet, 27)}});
-}
-
-// Counted interfaces share their entry's addresses and are found by their
-// computed names (a stem ending in a digit splits more than one way); the
-// IPv6 record cuts its address text as the adapter record cuts its texts.
-TEST_F(HostSimNodes, InterfaceNodesServeListsAndRecords) {
-    const nlohmann::json interfaces = nlohmann::json::array({
-        {{"name", "probe"}, {"ipv4Address", "192.168.10.21"},
-         {"ipv6", {{{"address", "fe80::1"}}, {{"instance", "b"}, {"address", alphabet}, {"prefixLength", "0x11223344"}}}}},
-        {{"name", "vmk1"}, {"count", 11}, {"ipv4Address", "10.0.0.1"}},
-    });
-    serve({{"hostType", "Corlai"}, {"ipInterfaces", interfaces}});
-    std::vector<std::string> names = {"probe"};
-    for (int n = 0; n < 11; ++n) names.push_back("vmk1" + std::to_string(n));
-    EXPECT_EQ(listedNames(214), names);
-    EXPECT_EQ(listedNames(243, {"probe"}), (std::vector<std::string>{"0", "b"}));
-    EXPECT_EQ(listedNames(243, {"vmk110"}), std::vector<std::string>{});
-    expectRecord(239, {"vmk110"}, 4, {{0, {10, 0, 0, 1}}});
-    expectRecord(244, {"probe", "b"}, 68, {{0, textField(alphabet, 48)}, {48, word(0x11223344)}});
 }
 
 }  // namespace

@@ -8,16 +8,6 @@
 namespace hostsim_test {
 namespace {
 
-// The record as bytes, so the offsets are checked and not the struct.
-Bytes queriedRecord(int *status) {
-    Bytes record(sizeof(SystemVersionInfo), 0xee);
-    SystemVersionInfo info;
-    std::memcpy(&info, record.data(), record.size());
-    *status = OskuserVersion_GetSystemVersion(&info);
-    std::memcpy(record.data(), &info, record.size());
-    return record;
-}
-
 std::string textAt(const Bytes &record, std::size_t offset, std::size_t width) {
     const auto *start = reinterpret_cast<const char *>(record.data() + offset);
     return std::string(start, ::strnlen(start, width));
@@ -29,9 +19,12 @@ TEST_F(HostSimSystemVersion, TheRecordAtItsOffsetsWithFullWidthTexts) {
     serve({{"hostType", "Corla"},
            {"systemVersion", {{"productName", std::string(31, 'p')}, {"versionText", ""}, {"infoText", "i"},
                               {"releaseDate", std::string(63, 'd')}, {"buildNumber", -2}}}});
-    int status = -1;
-    const Bytes record = queriedRecord(&status);
-    ASSERT_EQ(status, 0);
+    // Read as bytes, so that the offsets are checked and not the struct.
+    SystemVersionInfo info;
+    std::memset(&info, 0xee, sizeof info);
+    ASSERT_EQ(OskuserVersion_GetSystemVersion(&info), 0);
+    Bytes record(sizeof info);
+    std::memcpy(record.data(), &info, sizeof info);
     EXPECT_EQ(textAt(record, 0, 32), std::string(31, 'p'));
     EXPECT_EQ(textAt(record, 32, 32), "");
     EXPECT_EQ(textAt(record, 64, 32), "i");

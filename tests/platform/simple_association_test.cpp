@@ -5,7 +5,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <array>
 #include <string>
 #include <vector>
 
@@ -35,28 +34,22 @@ std::vector<std::string> texts(const std::vector<ObjectPath> &paths, const std::
 enum Operation { associators, associatorNames, references, referenceNames };
 const std::vector<Operation> kAllOperations = {associators, associatorNames, references, referenceNames};
 
-// The association class, result class, role and result role of a request;
-// the reference operations take the first and the third only.
-using Filters = std::array<const char *, 4>;
-const Filters kNone = {"", "", "", ""};
-
 class SimpleAssociation : public testing::Test {
 protected:
-    Response request(Operation operation, const ObjectPath &source, const Filters &f,
+    Response request(Operation operation, const ObjectPath &source, const char *resultClass = "",
                      const PropertyList &properties = std::nullopt) {
-        if (operation == associators) return broker.associators(source, f[0], f[1], f[2], f[3], properties);
-        if (operation == associatorNames) return broker.associatorNames(source, f[0], f[1], f[2], f[3]);
-        if (operation == references) return broker.references(source, f[0], f[2], properties);
-        return broker.referenceNames(source, f[0], f[2]);
+        if (operation == associators) return broker.associators(source, "", resultClass, "", "", properties);
+        if (operation == associatorNames) return broker.associatorNames(source, "", resultClass, "", "");
+        if (operation == references) return broker.references(source, "", "", properties);
+        return broker.referenceNames(source, "", "");
     }
 
     Broker broker{loadBrokerConfig({TVX_OMCTESTPROVIDER_DIR}, {TVX_OMCTESTPROVIDER_REG}, {TVX_OMCTESTPROVIDER_MOF})};
 };
 
-// The provider ignores every filter, so the base must apply them (their
-// kinds, and their places in what a provider is given, are the product's
-// association tests'). A source without associations gets nothing, a failing
-// one only its status.
+// The provider ignores every filter, so the base must apply them (every
+// kind of filter, from either end, is the product's association tests'). A
+// source without associations gets nothing, a failing one only its status.
 TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {
     const ObjectPath alpha = system("alpha");
     const ObjectPath disk0 = object("Test_Disk", "disk0");
@@ -65,26 +58,23 @@ TEST_F(SimpleAssociation, EachOperationAnswersWhatItsFiltersLetThrough) {
     const struct {
         std::vector<Operation> operations;
         ObjectPath source;
-        Filters filters;
+        const char *resultClass;
         std::vector<ObjectPath> answers;
         CMPIrc rc = CMPI_RC_OK;
         const char *message = "";
     } cases[] = {
-        {{associatorNames}, alpha, kNone, {disk0, object("Test_Device", "nic0"), ghost, disk1}},
+        {{associatorNames}, alpha, "", {disk0, object("Test_Device", "nic0"), ghost, disk1}},
         // Only far ends that exist are fetched, whether the source exists or not.
-        {{associators}, alpha, {"", "Test_Disk", "", ""}, {disk0, disk1}},
-        {{associators}, ghost, kNone, {alpha}},
-        {kAllOperations, system("lonely"), kNone, {}},
-        {kAllOperations, system("broken"), kNone, {}, CMPI_RC_ERR_FAILED, "broken system"},
-        {kAllOperations, system("confused"), kNone, {}, CMPI_RC_ERR_FAILED,
-         "doReferences returned something other than an association instance"},
+        {{associators}, alpha, "Test_Disk", {disk0, disk1}},
+        {{associators}, ghost, "", {alpha}},
+        {kAllOperations, system("lonely"), "", {}},
+        {kAllOperations, system("broken"), "", {}, CMPI_RC_ERR_FAILED, "broken system"},
     };
     for (const auto &c : cases) {
         for (const Operation operation : c.operations) {
-            const Filters &f = c.filters;
-            SCOPED_TRACE(testing::Message() << "operation " << operation << " from " << formatPath(c.source) << ": "
-                                            << f[0] << "|" << f[1] << "|" << f[2] << "|" << f[3]);
-            const Response response = request(operation, c.source, f);
+            SCOPED_TRACE(testing::Message() << "operation " << operation << " from " << formatPath(c.source) << " "
+                                            << c.resultClass);
+            const Response response = request(operation, c.source, c.resultClass);
             EXPECT_EQ(response.rc, c.rc);
             EXPECT_EQ(response.message.value_or(""), c.message);
             EXPECT_EQ(response.done, c.rc == CMPI_RC_OK);
@@ -105,7 +95,7 @@ TEST_F(SimpleAssociation, AnswersKeepTheListedPropertiesTheKeysAndTheReferences)
         {references, PropertyList{std::vector<std::string>{}}, {"Antecedent", "Dependent"}},
     };
     for (const auto &c : cases) {
-        const Response response = request(c.operation, system("alpha"), kNone, c.properties);
+        const Response response = request(c.operation, system("alpha"), "", c.properties);
         ASSERT_EQ(response.instances.size(), c.operation == associators ? 3U : 4U) << response.message.value_or("");
         for (const Instance &answer : response.instances) {
             std::vector<std::string> names;

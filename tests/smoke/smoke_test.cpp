@@ -24,14 +24,13 @@ TEST(Smoke, RunningMachineMatchesTargetArchitecture) {
 }
 
 #if TVX_SMOKE_EXPECT_ASAN
-void write_past_end() {
-  char* block = new char[4];
-  volatile std::size_t index = 4;
-  block[index] = 1;
-  delete[] block;
-}
-
 TEST(SmokeDeathTest, AddressSanitizerStopsHeapOverflow) {
+  const auto write_past_end = [] {
+    char* block = new char[4];
+    volatile std::size_t index = 4;
+    block[index] = 1;
+    delete[] block;
+  };
   EXPECT_DEATH(write_past_end(), "heap-buffer-overflow");
 }
 #endif
@@ -46,24 +45,19 @@ TEST(SmokeDeathTest, UndefinedSanitizerStopsSignedOverflow) {
 #endif
 
 #if TVX_SMOKE_EXPECT_TSAN
-void race_on_counter() {
-  int counter = 0;
-  std::thread first([&counter] { ++counter; });
-  std::thread second([&counter] { ++counter; });
-  first.join();
-  second.join();
-}
-
 // ThreadSanitizer exits with 66 after a report, whether it halts at once or
 // at exit.
 TEST(SmokeDeathTest, ThreadSanitizerReportsDataRace) {
   GTEST_FLAG_SET(death_test_style, "threadsafe");
-  EXPECT_EXIT(
-      {
-        race_on_counter();
-        std::exit(0);
-      },
-      ::testing::ExitedWithCode(66), "data race");
+  int counter = 0;
+  const auto race = [&counter] {
+    std::thread first([&counter] { ++counter; });
+    std::thread second([&counter] { ++counter; });
+    first.join();
+    second.join();
+    std::exit(0);
+  };
+  EXPECT_EXIT(race(), ::testing::ExitedWithCode(66), "data race");
 }
 #endif
 

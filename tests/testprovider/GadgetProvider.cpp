@@ -12,11 +12,9 @@ using namespace testprovider;
 
 class GadgetProvider : public InstanceProvider {
 public:
-    GadgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
+    GadgetProvider(const CmpiBroker &mb, const CmpiContext &ctx) : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
 
-    CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
-                                 const CmpiObjectPath &cop) override {
+    CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop) override {
         const CmpiString ns = cop.getNameSpace();
         const CmpiEnumeration widgets = broker.enumInstanceNames(ctx, CmpiObjectPath(ns, kWidgetClass));
         while (widgets.hasNext()) {

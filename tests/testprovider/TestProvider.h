@@ -3,7 +3,6 @@
 // instance provider.
 #pragma once
 
-#include <atomic>
 #include <string>
 
 #include "CmpiResultFilters.h"
@@ -19,8 +18,7 @@ inline constexpr const char *kVanishingWidget = "vanishing";
 // The text of a string key; a missing or null key is the caller's mistake.
 inline std::string stringKey(const CmpiObjectPath &path, const char *key) {
     const CmpiData value = path.getKey(key);
-    const char *text = value.isNotFound() || value.isNullValue() ? nullptr
-                                                                 : static_cast<const char *>(value);
+    const char *text = value.isNotFound() || value.isNullValue() ? nullptr : static_cast<const char *>(value);
     if (text == nullptr) {
         throw CmpiStatus(CMPI_RC_ERR_INVALID_PARAMETER, (std::string(key) + " key missing").c_str());
     }
@@ -53,25 +51,16 @@ inline std::string widgetNameOf(const std::string &gadgetId) {
     return gadgetId.substr(prefix.size());
 }
 
-// An instance provider of this library: it counts its initializations, for
-// StatsProvider to report, and names its instances by the paths of what its
-// own enumInstances returns.
+// An instance provider of this library: it names its instances by the paths
+// of what its own enumInstances returns.
 class InstanceProvider : public CmpiInstanceMI {
 public:
     InstanceProvider(const CmpiBroker &mb, const CmpiContext &ctx) : CmpiBaseMI(mb, ctx), CmpiInstanceMI(mb, ctx) {}
 
-    CmpiStatus initialize(const CmpiContext &) override {
-        ++initializations;
-        return CmpiStatus(CMPI_RC_OK);
-    }
-
-    CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt,
-                                 const CmpiObjectPath &cop) override {
+    CmpiStatus enumInstanceNames(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop) override {
         CmpiResultInstanceToPathFilter names(rslt);
         return enumInstances(ctx, names, cop, nullptr);
     }
-
-    std::atomic<unsigned> initializations{0};
 };
 
 }  // namespace testprovider

@@ -33,8 +33,6 @@ struct Link {
     CmpiObjectPath gadget;
     bool fromWidget;
 
-    const char *nearRole() const { return fromWidget ? "Owner" : "Part"; }
-    const char *farRole() const { return fromWidget ? "Part" : "Owner"; }
     const CmpiObjectPath &far() const { return fromWidget ? gadget : widget; }
 
     CmpiInstance instance(const char **properties) const {
@@ -49,20 +47,19 @@ struct Link {
     }
 
     bool passes(const char *assocClass, const char *role) const {
-        return roleMatches(role, nearRole()) && classMatches(CmpiObjectPath(ns, kLinkClass), assocClass);
+        return roleMatches(role, fromWidget ? "Owner" : "Part") &&
+               classMatches(CmpiObjectPath(ns, kLinkClass), assocClass);
     }
 
     bool reaches(const char *resultClass, const char *resultRole) const {
-        return roleMatches(resultRole, farRole()) && classMatches(far(), resultClass);
+        return roleMatches(resultRole, fromWidget ? "Part" : "Owner") && classMatches(far(), resultClass);
     }
 };
 
 class WidgetGadgetProvider : public InstanceProvider, public CmpiAssociationMI {
 public:
     WidgetGadgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx),
-          InstanceProvider(mb, ctx),
-          CmpiAssociationMI(mb, ctx) {}
+        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx), CmpiAssociationMI(mb, ctx) {}
 
     CmpiStatus enumInstances(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
@@ -76,9 +73,8 @@ public:
         return done(rslt);
     }
 
-    CmpiStatus references(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
-                          const char *resultClass, const char *role,
-                          const char **properties) override {
+    CmpiStatus references(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op, const char *resultClass,
+                          const char *role, const char **properties) override {
         const std::optional<Link> link = linkOf(ctx, op);
         if (link && link->passes(resultClass, role)) rslt.returnData(link->instance(properties));
         return done(rslt);
@@ -90,9 +86,9 @@ public:
         return references(ctx, names, op, resultClass, role, nullptr);
     }
 
-    CmpiStatus associators(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op,
-                           const char *assocClass, const char *resultClass, const char *role,
-                           const char *resultRole, const char **properties) override {
+    CmpiStatus associators(const CmpiContext &ctx, CmpiResult &rslt, const CmpiObjectPath &op, const char *assocClass,
+                           const char *resultClass, const char *role, const char *resultRole,
+                           const char **properties) override {
         const std::optional<Link> link = linkOf(ctx, op);
         if (link && link->passes(assocClass, role) && link->reaches(resultClass, resultRole)) {
             rslt.returnData(broker.getInstance(ctx, link->far(), properties));

@@ -43,8 +43,7 @@ CmpiInstance makeWidget(const CmpiString &ns, const Widget &widget, const char *
 
 class WidgetProvider : public InstanceProvider {
 public:
-    WidgetProvider(const CmpiBroker &mb, const CmpiContext &ctx)
-        : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
+    WidgetProvider(const CmpiBroker &mb, const CmpiContext &ctx) : CmpiBaseMI(mb, ctx), InstanceProvider(mb, ctx) {}
 
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
@@ -78,8 +77,8 @@ public:
         throw CmpiStatus(CMPI_RC_ERR_ALREADY_EXISTS, "widget exists");
     }
 
-    CmpiStatus setInstance(const CmpiContext &, CmpiResult &, const CmpiObjectPath &,
-                           const CmpiInstance &, const char **) override {
+    CmpiStatus setInstance(const CmpiContext &, CmpiResult &, const CmpiObjectPath &, const CmpiInstance &,
+                           const char **) override {
         throw std::runtime_error("set failed");
     }
 

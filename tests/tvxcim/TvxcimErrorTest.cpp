@@ -29,8 +29,9 @@ TEST(TvxcimErrorTest, BadInputEndsInOneLineAndItsStatus) {
         {"StatusWithMessageEvenInJson", onTestProviders({"--json", "gi", R"(root/cimv2:Test_Widget.Name="zz")"}), 1,
          "CMPI_RC_ERR_NOT_FOUND (6): no widget zz"},
         {"StatusWithoutMessage",
-         onTestProviders({"gi", "root/cimv2:Test_ProviderStats.ProviderName=\"WidgetProvider\""}), 1,
-         "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
+         onTestProviders({"gi", R"(root/cimv2:Test_WidgetGadget.Owner="root/cimv2:Test_Widget.Name=\"alpha\"",)"
+                                R"(Part="root/cimv2:Test_Gadget.Id=\"gadget-alpha\"")"}),
+         1, "CMPI_RC_ERR_NOT_SUPPORTED (7)"},
         {"UnknownOption", onTestProviders({"--jsn", "ei", "Test_Widget"}), 2, "unknown option --jsn" + kUsageHint},
     };
     for (const auto &[what, args, status, message] : cases) {
@@ -47,8 +48,9 @@ TEST(TvxcimPreflightTest, RunsBeforeAnythingIsLoadedAndSeesTheCommandLine) {
         seenCommand = line.command;
         throw std::runtime_error("host not ready");
     };
-    const Outcome run = runWith(withFiles(TVX_TESTPROVIDER_DIR, kMissingFile, kMissingFile, {"ein", "Test_Widget"}),
-                            {hostReady});
+    const Outcome run = runWith({"--provider-dir", TVX_TESTPROVIDER_DIR, "--registration", kMissingFile, "--mof",
+                                 kMissingFile, "ein", "Test_Widget"},
+                                {hostReady});
     EXPECT_EQ(run.status, 1);
     EXPECT_EQ(run.err, "tvxcim: host not ready\n");
     EXPECT_EQ(seenCommand, "ein");

@@ -19,27 +19,19 @@ struct Outcome {
 };
 
 inline Outcome runWith(const Args &args,
-                   const std::vector<tvxcim::PreflightCheck> &checks = tvxcim::standardPreflightChecks()) {
+                       const std::vector<tvxcim::PreflightCheck> &checks = tvxcim::standardPreflightChecks()) {
     std::ostringstream out;
     std::ostringstream err;
-    Outcome run;
-    run.status = tvxcim::runTvxcim(args, out, err, checks);
-    run.out = out.str();
-    run.err = err.str();
-    return run;
+    const int status = tvxcim::runTvxcim(args, out, err, checks);
+    return {status, out.str(), err.str()};
 }
 
-// The options that load providers from `dir` as `registration` and `mof`
-// describe them, followed by `rest`.
-inline Args withFiles(const std::string &dir, const std::string &registration, const std::string &mof,
-                      const Args &rest) {
-    Args args = {"--provider-dir", dir, "--registration", registration, "--mof", mof};
+// The options that load the test providers, followed by `rest`.
+inline Args onTestProviders(const Args &rest) {
+    Args args = {"--provider-dir", TVX_TESTPROVIDER_DIR, "--registration", TVX_TESTPROVIDER_REG,
+                 "--mof", TVX_TESTPROVIDER_MOF};
     args.insert(args.end(), rest.begin(), rest.end());
     return args;
-}
-
-inline Args onTestProviders(const Args &rest) {
-    return withFiles(TVX_TESTPROVIDER_DIR, TVX_TESTPROVIDER_REG, TVX_TESTPROVIDER_MOF, rest);
 }
 
 inline Outcome runOnTestProviders(const Args &rest) { return runWith(onTestProviders(rest)); }

@@ -1,11 +1,11 @@
-// Fixed systems and devices served as instances, and the associations
+// A fixed system and devices served as instances, and the associations
 // between them on OMC::SimpleAssociationMI. Like the product's providers it
 // answers associations from paths alone and reuses one instance per
 // association class for all its answers; unlike them it ignores every filter,
 // so the tests see the filtering the base does. Every reference is rebuilt
 // without a namespace, not copied from the request, so the base must
-// recognise the source end. The systems and devices listed exist; a link
-// may name one that does not.
+// recognise the source end. System alpha and the devices listed exist; a
+// link may name one that does not.
 #include <string>
 
 #include "CmpiInstanceMI.h"
@@ -13,8 +13,6 @@
 #include "platform/OmcSimpleAssociationMI.h"
 
 namespace {
-
-constexpr const char *kSystems[] = {"alpha"};
 
 struct Device {
     const char *className;
@@ -38,10 +36,8 @@ constexpr Link kLinks[] = {
     {"Test_HostedDevice", "broken", "Test_Disk", "disk9"},
 };
 
-// Asking for the associations of the broken system fails; those of the
-// confused one come back as a path, which no association is.
+// Asking for the associations of the broken system fails.
 constexpr const char *kBrokenSystem = "broken";
-constexpr const char *kConfusedSystem = "confused";
 
 CmpiObjectPath keyedPath(const char *className, const char *key, const std::string &value) {
     CmpiObjectPath path(nullptr, className);
@@ -75,9 +71,7 @@ public:
     CmpiStatus enumInstances(const CmpiContext &, CmpiResult &rslt, const CmpiObjectPath &cop,
                              const char **properties) override {
         const CmpiString className = cop.getClassName();
-        if (className.equalsIgnoreCase("Test_System")) {
-            for (const char *name : kSystems) rslt.returnData(instanceOf(cop, name, properties));
-        }
+        if (className.equalsIgnoreCase("Test_System")) rslt.returnData(instanceOf(cop, "alpha", properties));
         for (const Device &device : kDevices) {
             if (className.equalsIgnoreCase(device.className)) rslt.returnData(instanceOf(cop, device.name, properties));
         }
@@ -93,7 +87,6 @@ public:
         const CmpiString ns = op.getNameSpace();
         CmpiInstance hosted(CmpiObjectPath(ns, "Test_HostedDevice"));
         CmpiInstance spare(CmpiObjectPath(ns, "Test_SpareDevice"));
-        if (fromSystem && name == kConfusedSystem) rslt.returnData(op);
         for (const Link &link : kLinks) {
             if (name != (fromSystem ? link.system : link.device)) continue;
             CmpiInstance &association = std::string(link.assocClass) == "Test_SpareDevice" ? spare : hosted;
