@@ -3,13 +3,17 @@
 // they can be woken, subscriptions to both indication classes made and
 // removed, and then a broker shutdown while requests are still in flight.
 // Every request must be answered as it is when served alone (or, once the
-// shutdown has begun, refused), and nothing may hang: the test's timeout
-// ends a run that does not.
+// shutdown has begun, refused), and nothing may hang: a watchdog fails the
+// test and ends the process, naming what it was doing, if the whole does
+// not end in time.
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <atomic>
 #include <chrono>
+#include <condition_variable>
+#include <cstdio>
+#include <mutex>
 #include <thread>
 
 #include "EventSink.h"
@@ -30,9 +34,38 @@ constexpr int kClients = 4;
 constexpr int kRounds = 2;  // of the whole request list, per client
 constexpr int kThreadCycles = 10;
 constexpr int kSubscriptionRounds = 10;
+constexpr auto kLimit = 240s;
 
 constexpr const char *kNs = "root/cimv2";
 const char *const kIndicationClasses[] = {"Talvex_CIMHeartbeat", "Talvex_KernelIPChangedIndication"};
+
+class Watchdog {
+public:
+    explicit Watchdog(std::chrono::seconds limit)
+        : watcher([this, limit] {
+              std::unique_lock<std::mutex> lock(mutex);
+              if (endedChanged.wait_for(lock, limit, [this] { return ended; })) return;
+              ADD_FAILURE() << "no end within " << limit.count() << " s while " << phase.load();
+              std::fflush(stdout);
+              std::_Exit(1);
+          }) {}
+    ~Watchdog() {
+        {
+            const std::lock_guard<std::mutex> lock(mutex);
+            ended = true;
+        }
+        endedChanged.notify_all();
+        watcher.join();
+    }
+
+    std::atomic<const char *> phase{"serving"};
+
+private:
+    std::mutex mutex;
+    std::condition_variable endedChanged;
+    bool ended = false;
+    std::thread watcher;  // last: it starts once the rest is built
+};
 
 class Stress : public testing::TestWithParam<ThreadRelease> {
 protected:
@@ -136,6 +169,7 @@ protected:
 };
 
 TEST_P(Stress, EveryRequestIsAnsweredUnderLoadAndThroughShutdown) {
+    Watchdog watchdog(kLimit);
     ASSERT_FALSE(requests.empty());
     brokertest::EventSink sink;
     std::atomic<bool> clientsEnded{false};
@@ -151,6 +185,7 @@ TEST_P(Stress, EveryRequestIsAnsweredUnderLoadAndThroughShutdown) {
     while (answered < total / 2 || threadCycles < kThreadCycles || subscriptionRounds < kSubscriptionRounds) {
         std::this_thread::sleep_for(1ms);
     }
+    watchdog.phase = "shutting the broker down";
     shuttingDown = true;
     const std::size_t heartbeats = sink.received().size();
     broker->shutdown();
