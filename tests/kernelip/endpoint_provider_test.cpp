@@ -51,7 +51,7 @@ TEST_F(EndpointProvider, GetInstanceTakesTheFirstRecordOfItsClassAndName) {
         const Instance &found = response.instances[0];
         const CimValue *v4 = found.property("IPv4Address");
         EXPECT_EQ(v4 != nullptr ? v4->text : found.property("IPv6Address")->text, c.address);
-        EXPECT_TRUE(equalsIgnoreCase(found.path.className, c.cls));
+        EXPECT_EQ(found.path.className, c.cls);
     }
 }
 
