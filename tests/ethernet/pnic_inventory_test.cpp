@@ -1,18 +1,16 @@
-// The adapter walk against the stand-in host: records in kernel order, the
-// records a list that cannot be made leaves, the ethtool reply turned into
-// port type and autonegotiation, the driver's device outside the service
-// console, and the MAC text.
+// The adapter walk against the stand-in host: records in kernel order with
+// long names cut, the ethtool reply turned into port type and
+// autonegotiation, and the driver's device outside the service console. The MAC text is the provider tests',
+// a list that cannot be made the fault sweep's.
 #include <linux/ethtool.h>
 #include <net/if.h>
 
-#include <cstring>
 #include <map>
 #include <string>
 #include <vector>
 
 #include <gtest/gtest.h>
 
-#include "ethernet/AdapterRecord.h"
 #include "ethernet/EthtoolRequest.h"
 #include "ethernet/GetPnicDetails.h"
 #include "ethernet/LinkSettings.h"
@@ -20,15 +18,6 @@
 
 namespace EthernetProvider {
 namespace {
-
-// A host whose adapters have nothing but their names.
-std::string profile(const std::string &hostType, const std::vector<std::string> &names,
-                    const std::string &faults = "") {
-    std::string json = R"({"hostType": ")" + hostType + R"(", "faults": [)" + faults + R"(], "adapters": [)";
-    for (const std::string &name : names) json += R"({"name": ")" + name + R"("},)";
-    if (!names.empty()) json.pop_back();  // the comma after the last adapter
-    return json + "]}";
-}
 
 // A driver that answers from a table, and remembers the names it was asked for.
 std::map<std::string, ethtool_cmd> driverReplies;
@@ -53,12 +42,6 @@ ethtool_cmd reply(uint32_t supported, uint8_t port, uint16_t speed, uint16_t spe
     return cmd;
 }
 
-struct Inventory {
-    unsigned int result;
-    std::vector<PnicDetails> pnics;
-    std::vector<std::string> names;
-};
-
 class PnicInventory : public testing::Test {
 protected:
     void SetUp() override { previous = replaceEthtoolRequest(scriptedDriver); }
@@ -70,13 +53,16 @@ protected:
         HostSim_ResetProfile();
     }
 
-    static Inventory take(const std::string &json) {
+    // The records of a host whose adapters have nothing but their names.
+    static std::vector<PnicDetails> take(const std::string &hostType, const std::vector<std::string> &names) {
+        std::string json = R"({"hostType": ")" + hostType + R"(", "adapters": [)";
+        for (const std::string &name : names) json += R"({"name": ")" + name + R"("},)";
+        json.back() = ']';
         char error[256];
-        EXPECT_EQ(HostSim_LoadProfileText(json.c_str(), error, sizeof error), 0) << error;
-        Inventory taken{};
-        taken.result = getPnicDetails(taken.pnics);
-        for (const PnicDetails &pnic : taken.pnics) taken.names.push_back(pnic.name);
-        return taken;
+        EXPECT_EQ(HostSim_LoadProfileText((json + "}").c_str(), error, sizeof error), 0) << error;
+        std::vector<PnicDetails> pnics;
+        EXPECT_EQ(getPnicDetails(pnics), 0u);
+        return pnics;
     }
 
     EthtoolRequest previous = nullptr;
@@ -84,73 +70,32 @@ protected:
 
 // Outside the service console the driver is reached through its device,
 // which this machine does not have; what the port record then holds is
-// compared in the provider tests.
-TEST_F(PnicInventory, RecordsFollowTheKernelListWithLongNamesCut) {
-    const std::string longName(130, 'n');
-    driverReplies = {{"vmnic3", reply(SUPPORTED_Autoneg, PORT_TP, 1000)}};
-    const Inventory taken = take(profile("Corlai", {"vmnic3", "vmnic1", longName}));
-    EXPECT_EQ(taken.result, 0u);
-    EXPECT_EQ(taken.names, (std::vector<std::string>{"vmnic3", "vmnic1", longName.substr(0, 127)}));
-    EXPECT_TRUE(askedNames.empty());
-}
-
-// The one fault that answers a shorter inventory instead of an error: the
-// walk ends where the list could not be made, keeping what came before.
-TEST_F(PnicInventory, AListThatCannotBeMadeEndsTheWalkWithoutFailingIt) {
-    const Inventory taken =
-        take(profile("Corlai", {"vmnic0", "vmnic1", "vmnic2"}, R"({"call": "PRB_ParamListCreate", "nth": 2})"));
-    EXPECT_EQ(taken.result, 0u);
-    EXPECT_EQ(taken.names, std::vector<std::string>{"vmnic0"});
-}
-
+// compared in the provider tests. In it, the driver is asked by the first
+// 15 characters of the name, and the record keeps 127.
 TEST_F(PnicInventory, ServiceConsoleAsksTheDriverThroughASocket) {
-    const std::string twentyChars = "vmnic_twenty_chars_x";
+    const std::string longName(130, 'n');
     driverReplies = {
         {"tp1000", reply(SUPPORTED_Autoneg, PORT_TP, 1000)},
         {"fibre1000", reply(0, PORT_FIBRE, 1000)},
         {"fibre2500", reply(SUPPORTED_Autoneg | SUPPORTED_TP, PORT_FIBRE, 2500)},
         {"highspeed", reply(0, PORT_TP, 1000, 1)},  // only the low speed bits count
-        {twentyChars.substr(0, 15), reply(0, PORT_TP, 10000)},
+        {longName.substr(0, 15), reply(0, PORT_TP, 10000)},
     };
-    const Inventory taken =
-        take(profile("Corla", {"tp1000", "fibre1000", "fibre2500", "highspeed", "silent", twentyChars}));
-    ASSERT_EQ(taken.result, 0u);
+    take("Corlai", {"tp1000"});
+    EXPECT_TRUE(askedNames.empty());
+    const std::vector<PnicDetails> pnics =
+        take("Corla", {"tp1000", "fibre1000", "fibre2500", "highspeed", "silent", longName});
     const struct {
         uint32_t portType;
         uint8_t autoSense;
     } expected[] = {{53, 1}, {102, 0}, {0, 1}, {53, 0}, {0, 0}, {55, 0}};
-    ASSERT_EQ(taken.pnics.size(), 6u);
-    for (std::size_t i = 0; i < taken.pnics.size(); ++i) {
-        EXPECT_EQ(taken.pnics[i].portType, expected[i].portType) << taken.names[i];
-        EXPECT_EQ(taken.pnics[i].autoSense, expected[i].autoSense) << taken.names[i];
+    ASSERT_EQ(pnics.size(), 6u);
+    for (std::size_t i = 0; i < pnics.size(); ++i) {
+        EXPECT_EQ(pnics[i].portType, expected[i].portType) << pnics[i].name;
+        EXPECT_EQ(pnics[i].autoSense, expected[i].autoSense) << pnics[i].name;
     }
-    EXPECT_EQ(taken.names[5], twentyChars);
-    EXPECT_EQ(askedNames.back(), twentyChars.substr(0, 15));
-}
-
-// The MAC text of the adapter record keeps the pairs it can read.
-TEST(MacAddress, ParsesPairsAndClearsWhatIsMissing) {
-    const struct {
-        const char *text;
-        uint8_t bytes[6];
-    } cases[] = {
-        {"02:11:22:aa:BB:cc", {0x02, 0x11, 0x22, 0xAA, 0xBB, 0xCC}},
-        {"02:11:zz:aa:bb:cc", {0x02, 0x11, 0, 0, 0, 0}},
-        {"", {0, 0, 0, 0, 0, 0}},
-        {"0211:22:aa:bb:cc", {0x02, 0, 0, 0, 0, 0}},
-    };
-    for (const auto &c : cases) {
-        uint8_t mac[6];
-        std::memset(mac, 0x5A, sizeof mac);
-        parseMacAddress(c.text, std::strlen(c.text) + 1, mac);
-        EXPECT_EQ(0, std::memcmp(mac, c.bytes, 6)) << c.text;
-    }
-    // A text filling its whole field is read no further than the field.
-    const char unterminated[4] = {'0', '2', ':', '1'};
-    uint8_t mac[6];
-    parseMacAddress(unterminated, sizeof unterminated, mac);
-    EXPECT_EQ(mac[0], 0x02);
-    EXPECT_EQ(mac[1], 0x01);
+    EXPECT_EQ(pnics[5].name, longName.substr(0, 127));
+    EXPECT_EQ(askedNames.back(), longName.substr(0, 15));
 }
 
 }  // namespace

@@ -53,17 +53,15 @@ TEST_F(Detection, ReportsEachGoneAddressOfTheSameFamilyForEachNewAddress) {
         {"netmask changed", {ipv4("eth0", "10.0.0.1")}, {ipv4("eth0", "10.0.0.1", "255.255.0.0")},
          {"Talvex:eth0 10.0.0.1/255.255.255.0 -> 10.0.0.1/255.255.0.0"}},
         {"IPv6 prefix changed", {ipv6("eth0", "fd00::1")}, {ipv6("eth0", "fd00::1", "ffff:ffff:ffff::")}, {}},
-        {"two replaced by two: new ones in list order, gone ones in their order",
+        {"two replaced by two: new ones in list order, gone ones in their order; a mask that is no run of ones "
+         "is prefix 0",
          {ipv6("eth0", "fd00::1"), ipv6("eth0", "fd00::2")},
-         {ipv6("eth0", "fd00::4"), ipv6("eth0", "fd00::3")},
-         {"Talvex:eth0 fd00::1/64 -> fd00::4/64", "Talvex:eth0 fd00::2/64 -> fd00::4/64",
+         {ipv6("eth0", "fd00::4", "ff00:ff00::"), ipv6("eth0", "fd00::3")},
+         {"Talvex:eth0 fd00::1/64 -> fd00::4/0", "Talvex:eth0 fd00::2/64 -> fd00::4/0",
           "Talvex:eth0 fd00::1/64 -> fd00::3/64", "Talvex:eth0 fd00::2/64 -> fd00::3/64"}},
         {"one of two replaced: the one kept is no replacement",
          {ipv4("eth0", "10.0.0.1"), ipv4("eth0", "10.0.0.3")}, {ipv4("eth0", "10.0.0.3"), ipv4("eth0", "10.0.0.2")},
          kChange},
-        {"interfaces in name order, not list order",
-         {ipv4("eth1", "10.0.1.1"), ipv4("eth0", "10.0.0.1")}, {ipv4("eth1", "10.0.1.2"), ipv4("eth0", "10.0.0.2")},
-         {kChange[0], "Talvex:eth1 10.0.1.1/255.255.255.0 -> 10.0.1.2/255.255.255.0"}},
         {"entries without a usable address are skipped",
          {linkLayer, ipv4("eth0", "", ""), ipv4("eth0", "10.0.0.1"), ipv6("eth0", "fd00::9", "")},
          {linkLayer, ipv4("eth0", "", ""), ipv6("eth0", "fd00::8", ""), ipv4("eth0", "10.0.0.2", ""),
@@ -105,10 +103,8 @@ TEST_F(Detection, AFailedReadIsLoggedAndKeepsWhatWasReadBefore) {
     addresses.failOneRead(ENOMEM, 1);
     cycle();
     EXPECT_EQ(broker.takeSummaries(), kChange);
-    EXPECT_EQ(takeLoggedLines(),
-              (std::vector<LoggedLine>{{LOG_ERR, std::string("Unable to refresh network interface information of "
-                                                             "the system, Error: ") +
-                                                     std::strerror(ENOMEM) + "\n"}}));
+    const std::string refreshFailed = "Unable to refresh network interface information of the system, Error: ";
+    EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, refreshFailed + std::strerror(ENOMEM) + "\n"}}));
     cycle();
     EXPECT_EQ(broker.takeSummaries(), kChange);
     cycle();
@@ -116,11 +112,11 @@ TEST_F(Detection, AFailedReadIsLoggedAndKeepsWhatWasReadBefore) {
 }
 
 TEST_F(Detection, ARefusedDeliveryIsLoggedWithItsCodeAndTheRestAreStillSent) {
-    enableOver({ipv6("vmk0", "fd00::1", "ffff:ffff:ffff::"), ipv4("vmk1", "10.0.0.1")},
+    enableOver({ipv6("vmk0", "fd00::1", "ffff:fe00::"), ipv4("vmk1", "10.0.0.1")},
                {ipv6("vmk0", "fd00::3"), ipv4("vmk1", "10.0.0.2")});
     broker.refuseNext(1);
     cycle();
-    EXPECT_EQ(broker.takeSummaries(), (Lines{"Talvex:vmk0 fd00::1/48 -> fd00::3/64",
+    EXPECT_EQ(broker.takeSummaries(), (Lines{"Talvex:vmk0 fd00::1/23 -> fd00::3/64",
                                              "Talvex:vmk1 10.0.0.1/255.255.255.0 -> 10.0.0.2/255.255.255.0"}));
     EXPECT_EQ(takeLoggedLines(), (std::vector<LoggedLine>{{LOG_ERR, "Failed to deliver indication " +
                                                                         std::to_string(CMPI_RC_ERR_FAILED) + "\n"}}));
@@ -130,33 +126,24 @@ TEST_F(Detection, ARefusedDeliveryIsLoggedWithItsCodeAndTheRestAreStillSent) {
 // a listener receives.
 TEST_F(Detection, IndicationCarriesTheSourcesPathHostAndTime) {
     const std::string host = OMC::getComputerSystemName(broker.context(), broker.broker());
-    const struct {
-        std::string className, sourceHost;
-    } cases[] = {
-        {"Talvex_KernelIPv4ProtocolEndpoint", "192.168.7.20"},
-        {"Talvex_KernelIPv6ProtocolEndpoint", "fd00::a:2"},
-    };
-    enableOver({ipv4("vmk1", "192.168.7.1"), ipv6("vmk1", "fd00::1")},
-               {ipv4("vmk1", "192.168.7.20"), ipv6("vmk1", "fd00:0::a:2")});
+    enableOver({ipv6("vmk1", "fd00::1")}, {ipv6("vmk1", "fd00:0::a:2")});
     const std::uint64_t earliest = std::time(nullptr);
     cycle();
     const std::uint64_t latest = std::time(nullptr);
     const std::vector<tvxbroker::Instance> delivered = broker.takeDelivered();
-    ASSERT_EQ(delivered.size(), 2u) << "to " << kNs;
-    for (std::size_t i = 0; i < 2; ++i) {
-        const tvxbroker::Instance &event = delivered[i];
-        EXPECT_EQ(event.path.className, "Talvex_KernelIPChangedIndication");
-        EXPECT_EQ(valueOf(event, "PerceivedSeverity"), "3");
-        EXPECT_EQ(valueOf(event, "SourceInstanceModelPath"),
-                  "root/cimv2:" + cases[i].className + ".SystemCreationClassName=\"OMC_UnitaryComputerSystem\","
-                  "SystemName=\"" + host + "\",CreationClassName=\"" + cases[i].className + "\",Name=\"vmk1\"");
-        EXPECT_EQ(valueOf(event, "SourceInstanceHost"), cases[i].sourceHost);
-        const tvxbroker::DateTime time = event.property("IndicationTime")->dateTime;
-        EXPECT_FALSE(time.interval);
-        EXPECT_EQ(time.microseconds % 1000000u, 0u) << "whole seconds";
-        EXPECT_GE(time.microseconds / 1000000u, earliest);
-        EXPECT_LE(time.microseconds / 1000000u, latest);
-    }
+    ASSERT_EQ(delivered.size(), 1u) << "to " << kNs;
+    const tvxbroker::Instance &event = delivered[0];
+    EXPECT_EQ(event.path.className, "Talvex_KernelIPChangedIndication");
+    EXPECT_EQ(valueOf(event, "PerceivedSeverity"), "3");
+    EXPECT_EQ(valueOf(event, "SourceInstanceModelPath"),
+              "root/cimv2:Talvex_KernelIPv6ProtocolEndpoint.SystemCreationClassName=\"OMC_UnitaryComputerSystem\","
+              "SystemName=\"" + host + "\",CreationClassName=\"Talvex_KernelIPv6ProtocolEndpoint\",Name=\"vmk1\"");
+    EXPECT_EQ(valueOf(event, "SourceInstanceHost"), "fd00::a:2");
+    const tvxbroker::DateTime time = event.property("IndicationTime")->dateTime;
+    EXPECT_FALSE(time.interval);
+    EXPECT_EQ(time.microseconds % 1000000u, 0u) << "whole seconds";
+    EXPECT_GE(time.microseconds / 1000000u, earliest);
+    EXPECT_LE(time.microseconds / 1000000u, latest);
 }
 
 }  // namespace

@@ -17,6 +17,8 @@
 #include "core/Broker.h"
 #include "hostsim/HostSimControl.h"
 #include "latchedhealth/HealthInfo.h"
+#include "latchedhealth/HealthMonitor.h"
+#include "latchedhealth/LatchedHealthState.h"
 #include "model/PathText.h"
 
 namespace latchedtest {
@@ -44,25 +46,77 @@ inline std::string profileWith(const std::string &elements) {
 class LatchedHealthBroker : public testing::Test {
 protected:
     void SetUp() override { start(linkedInConfig()); }
-    void TearDown() override;
+    void TearDown() override {
+        stop();
+        EXPECT_EQ(HostSim_LiveListCount(), 0u);
+        HostSim_ResetProfile();
+    }
 
     // The product's and the stand-in's registrations, the latched-health
-    // providers taken from the test program.
-    static BrokerConfig linkedInConfig();
-    void start(BrokerConfig config);
-    void stop();
+    // providers taken from the test program ("linkedin"), with a class of
+    // the test's MOF that the instance provider does not serve and a sensor
+    // class whose name does not fit a record.
+    static BrokerConfig linkedInConfig() {
+        BrokerConfig config = loadBrokerConfig({TVX_PROVIDER_DIR, TVX_HOST_PROVIDER_DIR},
+                                               {TVX_PROVIDER_REG, TVX_HOST_PROVIDER_REG},
+                                               {TVX_PRODUCT_MOFS, TVX_HOST_PROVIDER_MOF, TVX_TEST_MOF});
+        std::vector<ProviderRegistration> extra;
+        for (ProviderRegistration &registration : config.registrations) {
+            const std::string &provider = registration.providerName;
+            if (provider == "Talvex_LatchedHealthState" || provider == "Talvex_LatchedHealthAssociation" ||
+                provider == "Talvex_KernelIPChangedIndication") {
+                registration.location = "linkedin";
+            }
+            ProviderRegistration added = registration;
+            if (registration.className == "Talvex_LatchedHealthState") added.className = "Test_UnservedHealth";
+            if (registration.className == "CIM_Sensor") added.className = kLongSensorClass;
+            if (added.className != registration.className) extra.push_back(added);
+        }
+        config.registrations.insert(config.registrations.end(), extra.begin(), extra.end());
+        config.inProcessLocations = {"linkedin"};
+        return config;
+    }
 
-    static void serve(const std::string &profileJson);
+    void start(BrokerConfig config) {
+        broker = std::make_unique<Broker>(std::move(config));
+        const CmpiBroker mb(broker->cmpiBroker());
+        threadContext = mb.prepareAttachThread(CmpiContext(broker->newContext(kNs)));
+        mb.attachThread(threadContext);
+    }
+
+    void stop() {
+        CmpiBroker(broker->cmpiBroker()).detachThread(threadContext);
+        broker->shutdown();
+    }
+
+    static void serve(const std::string &profileJson) {
+        char error[512];
+        ASSERT_EQ(HostSim_LoadProfileText(profileJson.c_str(), error, sizeof error), 0) << error;
+    }
+
     // One whole poll with the health thread's lock held, as the thread runs it.
-    void poll();
+    void poll() {
+        const OMC::MutexLock lock(TvLatchedHealth::healthMutex);
+        TvLatchedHealth::pollWatchedClasses(CmpiBroker(broker->cmpiBroker()), threadContext);
+    }
+
     // Copies, taken under the lock, of the records whose elements have this
     // DeviceID key, in list order.
-    static std::vector<TvLatchedHealth::HealthInfo> recordsOf(const std::string &deviceId);
+    static std::vector<TvLatchedHealth::HealthInfo> recordsOf(const std::string &deviceId) {
+        std::vector<TvLatchedHealth::HealthInfo> found;
+        const OMC::MutexLock lock(TvLatchedHealth::healthMutex);
+        for (const auto &record : TvLatchedHealth::healthList) {
+            for (const TvLatchedHealth::HealthKey &key : record->keys) {
+                if (key.keyName == "DeviceID" && key.keyValue == deviceId) found.push_back(*record);
+            }
+        }
+        return found;
+    }
     static std::optional<TvLatchedHealth::HealthInfo> recordOf(const std::string &deviceId) {
         const auto found = recordsOf(deviceId);
         return found.empty() ? std::nullopt : std::optional(found.front());
     }
-    static std::uint16_t rollup();
+    static std::uint16_t rollup() { return TvLatchedHealth::rollupHealthState.load(); }
 
     static ObjectPath classPath(const std::string &cls) { return ObjectPath{"", kNs, cls, {}}; }
     static ObjectPath recordPath(const std::string &eventId, const std::string &cls = "Talvex_LatchedHealthState") {

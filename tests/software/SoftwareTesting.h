@@ -1,6 +1,5 @@
-// What the software tests share: the two images as the default host names
-// them, and a boot configuration of the test's own that the provider reads
-// for as long as it lives.
+// A boot configuration of the software tests' own, which the provider
+// reads for as long as it lives.
 #pragma once
 
 #include <gtest/gtest.h>
@@ -12,9 +11,6 @@
 #include <string>
 
 namespace softwaretest {
-
-inline constexpr const char *kRunningId = "Talvex Corlai 5.1.0 build-1483097";
-inline constexpr const char *kAltId = "Alt Boot Bank: Talvex Corlai 5.1.0 build-654321";
 
 class BootBankFile {
 public:

@@ -3,7 +3,7 @@
 // broker opens) to this definition before the C library's.
 #include <syslog.h>
 
-#include "SyslogRecording.h"
+#include "SyslogCapture.h"
 
 extern "C" __attribute__((visibility("default"))) void syslog(int priority, const char *format, ...) {
     va_list args;

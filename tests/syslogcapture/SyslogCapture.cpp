@@ -1,10 +1,10 @@
 #include "SyslogCapture.h"
-#include "SyslogRecording.h"
 
 #include <syslog.h>
 
 #include <cstdio>
 #include <mutex>
+#include <utility>
 
 namespace syslogcapture {
 namespace {
@@ -16,9 +16,7 @@ std::vector<LoggedLine> logged;
 
 std::vector<LoggedLine> takeLoggedLines() {
     const std::lock_guard<std::mutex> lock(loggedMutex);
-    std::vector<LoggedLine> lines;
-    lines.swap(logged);
-    return lines;
+    return std::exchange(logged, {});
 }
 
 void PrintTo(const LoggedLine &line, std::ostream *os) {

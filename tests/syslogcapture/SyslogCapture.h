@@ -3,6 +3,7 @@
 // reaches the system log meanwhile.
 #pragma once
 
+#include <cstdarg>
 #include <ostream>
 #include <string>
 #include <vector>
@@ -22,5 +23,8 @@ struct LoggedLine {
 std::vector<LoggedLine> takeLoggedLines();
 
 void PrintTo(const LoggedLine &line, std::ostream *os);
+
+// Where both ways of catching syslog hand over a line.
+void capture(int priority, const char *format, va_list args);
 
 }  // namespace syslogcapture

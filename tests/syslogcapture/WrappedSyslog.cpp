@@ -1,6 +1,6 @@
 // Calls of the test's own objects and static libraries, redirected here by
 // the linker (--wrap=syslog).
-#include "SyslogRecording.h"
+#include "SyslogCapture.h"
 
 extern "C" void __wrap_syslog(int priority, const char *format, ...) {
     va_list args;

@@ -1,7 +1,12 @@
-// Latching over scripted polls: each case scripts the watched elements'
-// health per poll and checks the records, the rollup and what was logged.
-// Records live for the whole process, so every case names its own elements.
-#include <gmock/gmock.h>
+// The latched-health providers over polls the tests script. Latching: each
+// case scripts the watched elements' health per poll and checks the
+// records, the rollup and what was logged. Then the instance provider and
+// the association as a client reaches them: every row of both operation
+// tables, event numbers as clients write them, and where the association
+// leads (names, instances and both ends on the default host are the
+// consistency suite's and the demo's). Records live for the whole process,
+// so every case names its own elements.
+#include <gtest/gtest.h>
 #include <syslog.h>
 
 #include <algorithm>
@@ -46,8 +51,6 @@ TEST_F(LatchingTest, EscalatesOnlyUpwardsWithNewEventNumbers) {
     EXPECT_GE(escalated->timestamp, up->timestamp);
     EXPECT_EQ(recordOf("unknown")->healthState, 10);
     EXPECT_NE(recordOf("unknown")->eventId, escalated->eventId);
-    EXPECT_EQ(escalated->hostName, std::string("esx1"));
-    EXPECT_EQ(escalated->nameSpace, std::string(kNs));
 }
 
 // null, missing and wrongly typed HealthState values count nowhere; healthy
@@ -113,6 +116,80 @@ TEST_F(LatchingTest, SameKeysInTwoClassesAreTwoElements) {
     std::vector<std::string> classes;
     for (const auto &record : recordsOf("twin")) classes.push_back(record.className);
     EXPECT_EQ(classes, (std::vector<std::string>{"Talvex_StorageVolume", "Talvex_StorageExtent"}));
+}
+
+std::string text(const CimValue *value) { return value != nullptr ? value->text : "<absent>"; }
+
+const ObjectPath kNumericEventId{"", kNs, "Talvex_LatchedHealthState", {{"EventId", CimValue::makeUnsigned(CMPI_uint32, 1)}}};
+
+class HealthProviderTest : public LatchedHealthBroker {
+protected:
+    // The number the element's record had after its first poll, which an
+    // escalation at the second gave up, and the record's number now.
+    std::pair<std::string, std::string> escalated(const std::string &deviceId) {
+        serve(profileWith(element("Talvex_DiskDrive", deviceId, "[10, 20]")));
+        poll();
+        const std::string before = std::to_string(recordOf(deviceId)->eventId);
+        poll();
+        return {before, std::to_string(recordOf(deviceId)->eventId)};
+    }
+};
+
+TEST_F(HealthProviderTest, OperationTables) {
+    const auto [before, id] = escalated("table");
+    const ObjectPath nullEventId{"", kNs, "Talvex_LatchedHealthState", {{"EventId", CimValue::makeNull(CMPI_string)}}};
+    const struct {
+        const char *what;
+        Response response;
+        CMPIrc rc;
+        const char *message;
+    } rows[] = {
+        {"ein other class", broker->enumInstanceNames(classPath("Test_UnservedHealth")), CMPI_RC_ERR_FAILED, "invalid class name"},
+        {"gi other class", broker->getInstance(recordPath(id, "Test_UnservedHealth"), std::nullopt), CMPI_RC_ERR_NOT_FOUND, "invalid class name"},
+        {"gi without EventId", broker->getInstance(classPath("Talvex_LatchedHealthState"), std::nullopt), CMPI_RC_ERR_FAILED, "failed to get instances"},
+        {"gi null EventId", broker->getInstance(nullEventId, std::nullopt), CMPI_RC_ERR_FAILED, "failed to get instances"},
+        {"rin without EventId", broker->referenceNames(classPath("Talvex_LatchedHealthState"), "", ""), CMPI_RC_ERR_FAILED, "Invalid event id"},
+        {"rin given-up EventId", broker->referenceNames(recordPath(before), "", ""), CMPI_RC_ERR_NOT_FOUND, "Requested event id not found"},
+    };
+    for (const auto &row : rows) {
+        EXPECT_EQ(row.response.rc, row.rc) << row.what;
+        EXPECT_EQ(row.response.message.value_or("<none>"), row.message) << row.what;
+        EXPECT_TRUE(row.response.instances.empty() && row.response.paths.empty()) << row.what;
+    }
+    EXPECT_NE(broker->referenceNames(kNumericEventId, "", "").rc, CMPI_RC_OK);
+}
+
+// The number is read as strtol reads it, clamped to 32 bits; the number an
+// escalated record gave up names nothing any more.
+TEST_F(HealthProviderTest, EventIdAsClientsWriteIt) {
+    const auto [before, id] = escalated("written");
+    const struct {
+        std::string eventId;
+        bool found;
+    } rows[] = {{id + "abc", true}, {"  +" + id, true}, {"-" + id, id == "0"}, {"99999999999999", false}, {before, false}};
+    for (const auto &row : rows) {
+        const Response got = broker->getInstance(recordPath(row.eventId), std::nullopt);
+        EXPECT_EQ(got.ok(), row.found) << row.eventId;
+        if (got.ok()) {
+            EXPECT_EQ(text(got.instances.at(0).property("EventId")), id) << row.eventId;
+        } else {
+            EXPECT_EQ(got.message.value_or(""), "failed to get instances") << row.eventId;
+        }
+    }
+    // Without digits the number is 0, whatever record that names.
+    EXPECT_EQ(broker->getInstance(recordPath("abc"), std::nullopt).rc, broker->getInstance(recordPath("0"), std::nullopt).rc);
+    EXPECT_NE(broker->getInstance(kNumericEventId, std::nullopt).rc, CMPI_RC_OK);
+}
+
+// The element keeps its host, and nothing leads back from it.
+TEST_F(HealthProviderTest, AssociationLeadsFromRecordToElementOnly) {
+    const Response refs = broker->references(recordPath(escalated("followed").second), "", "", {});
+    ASSERT_EQ(refs.instances.size(), 1u) << refs.message.value_or("");
+    const CimValue *dependent = refs.instances[0].property("Dependent");
+    ASSERT_TRUE(dependent && dependent->reference);
+    EXPECT_EQ(dependent->reference->host, "esx1");
+    const Response element = broker->associatorNames(*dependent->reference, "", "", "", "");
+    EXPECT_TRUE(element.ok() && element.paths.empty());
 }
 
 }  // namespace
